@@ -1,0 +1,71 @@
+// Portable primitives under every pixel kernel: pixel access, the two
+// storing rules and conversions that stay defined for every input.
+#ifndef VORLITE_CORE_INTERNAL_H
+#define VORLITE_CORE_INTERNAL_H
+
+#include <bit>
+#include <cstddef>
+#include <cstdint>
+#include <cstring>
+#include <limits>
+
+#include "zentra_vorlite.h"
+
+namespace vorlite::core {
+
+// Float built from its exact bit pattern, so a constant never depends on
+// how a decimal literal happens to round.
+constexpr float float_bits(std::uint32_t bits) { return std::bit_cast<float>(bits); }
+
+constexpr std::size_t pixel_count(const VorBitmap& bitmap) {
+    return static_cast<std::size_t>(bitmap.width) * bitmap.height;
+}
+
+constexpr std::size_t byte_count(const VorBitmap& bitmap) { return pixel_count(bitmap) * 4; }
+
+inline VorColor load_pixel(const std::uint8_t* p) {
+    VorColor c;
+    std::memcpy(&c, p, 4);
+    return c;
+}
+
+inline void store_pixel(std::uint8_t* p, VorColor c) { std::memcpy(p, &c, 4); }
+
+// Truncation toward zero that is defined for every input: NaN gives 0 and
+// values beyond the range of Int saturate instead of being undefined.
+template <typename Int, typename Real>
+constexpr Int truncate_clamped(Real v) {
+    constexpr Real lo = static_cast<Real>(std::numeric_limits<Int>::min());
+    // The largest Real below 2^bits of Int, so the conversion stays in range.
+    constexpr Real hi_exclusive = static_cast<Real>(std::numeric_limits<Int>::max() / 2 + 1) * 2;
+    if (!(v == v)) return 0;
+    if (v <= lo) return std::numeric_limits<Int>::min();
+    if (v >= hi_exclusive) return std::numeric_limits<Int>::max();
+    return static_cast<Int>(v);
+}
+
+// Storing by rounding: above 254.5 is 255, from -0.5 up it is trunc(v + 0.5)
+// computed in the value's own precision, below (and NaN) it is 0.
+template <typename Real>
+constexpr std::uint8_t store_rounded(Real v) {
+    if (v > static_cast<Real>(254.5)) return 255;
+    if (v >= static_cast<Real>(-0.5)) return static_cast<std::uint8_t>(static_cast<int>(v + static_cast<Real>(0.5)));
+    return 0;
+}
+
+// Storing by truncation: clamp to 0..255 (NaN to 0), then truncate.
+template <typename Real>
+constexpr std::uint8_t store_truncated(Real v) {
+    if (!(v > static_cast<Real>(0))) return 0;
+    if (v >= static_cast<Real>(255)) return 255;
+    return static_cast<std::uint8_t>(v);
+}
+
+// Clamp an integer to a channel byte.
+constexpr std::uint8_t clamp_byte(int v) {
+    return static_cast<std::uint8_t>(v < 0 ? 0 : (v > 255 ? 255 : v));
+}
+
+}  // namespace vorlite::core
+
+#endif

@@ -1,0 +1,24 @@
+// Processors whose primitives are not part of this build yet. A document
+// naming one fails to run, exactly as a document naming an unknown
+// processor does; each adapter moves beside its primitive when that lands.
+#include "proclist_internal.h"
+
+#define VORLITE_PENDING_PROCESSOR(name)                                         \
+    VOR_API int name(const yajl_val, VorBitmap*, const VLPLRunOptions*) { return 0; }
+
+extern "C" {
+
+VORLITE_PENDING_PROCESSOR(VLPLRunVignetteProcessor)
+VORLITE_PENDING_PROCESSOR(VLPLRunLegacyProcessor)
+VORLITE_PENDING_PROCESSOR(VLPLRunHistogramMappingProcessor)
+VORLITE_PENDING_PROCESSOR(VLPLRunGammaProcessor)
+VORLITE_PENDING_PROCESSOR(VLPLRunColorMatrixTransformProcessor)
+VORLITE_PENDING_PROCESSOR(VLPLRunIntensityMapProcessor)
+VORLITE_PENDING_PROCESSOR(VLPLRunFlareProcessor)
+VORLITE_PENDING_PROCESSOR(VLPLRunContrastProcessor)
+VORLITE_PENDING_PROCESSOR(VLPLRunBlendWithColorProcessor)
+VORLITE_PENDING_PROCESSOR(VLPLRunNoiseProcessor)
+VORLITE_PENDING_PROCESSOR(VLPLRunSharpnessProcessor)
+VORLITE_PENDING_PROCESSOR(VLPLRunGradientProcessor)
+
+}  // extern "C"
