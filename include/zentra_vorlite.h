@@ -205,21 +205,217 @@ VOR_API int VLPLRunGradientProcessor(const yajl_val parameters, VorBitmap* bitma
 /* Blend modes                                                            */
 /* ====================================================================== */
 
+/* Blend modes: how a source colour is laid over a destination pixel. */
+#define VOR_BLEND_NORMAL 0u
+#define VOR_BLEND_OVERLAY 1u
+#define VOR_BLEND_COLOR 2u /* hue and saturation of the source, luminance of the destination */
+#define VOR_BLEND_SCREEN 3u
+#define VOR_BLEND_DARKEN 4u
+#define VOR_BLEND_MULTIPLY 5u
+#define VOR_BLEND_SOFT_LIGHT 6u
+
+/* Memo of one source colour blended over every grey at each opacity level:
+ * 196868 bytes. Level L's maps (computed[L] != 0) give the red, green and
+ * blue result for each destination channel value at opacity L/255. */
+typedef struct VorColorBlendMemoTable {
+    uint32_t mode;
+    uint8_t computed[256];
+    uint8_t maps[256][3][256];
+} VorColorBlendMemoTable;
+
+/* Blends src over dst in place at opacity (not clamped; 1.0 replaces,
+ * 0.0 keeps); red, green, blue written, dst alpha never. src alpha is used
+ * only by the colour mode, as a saturation factor. Modes 7 and above give
+ * black colour channels. */
+VOR_API void VorColorBlend(VorColor* dst, const VorColor* src, uint32_t mode, float opacity);
+/* The colour mode with the source given as VorColorRGB2HSL's hue,
+ * saturation, lightness and its alpha; dst alpha kept. */
+VOR_API void VorColorBlendColorMode(VorColor* dst, const float srcHSL[3], int32_t srcAlpha,
+                                    float opacity);
+/* Sets the table's mode and marks every level not computed; no pixels. */
+VOR_API void VorColorBlendInitMemozied(VorColorBlendMemoTable* table, uint32_t mode);
+/* Blends src over dst at opacity level/255 (level 0..255, larger levels
+ * act as 255) through the grey maps of the table, filling the level on
+ * first use; dst alpha kept. One table serves one source colour. */
+VOR_API void VorColorBlendMemoized(VorColor* dst, const VorColor* src, uint32_t level,
+                                   VorColorBlendMemoTable* table);
+
 /* ====================================================================== */
 /* Bitmap compositing                                                     */
 /* ====================================================================== */
+
+/* Every compositing function writes red, green and blue of the destination
+ * in place and keeps its alpha bytes, except where the transformed blend
+ * fills with opaque white. Modes and opacities are those of VorColorBlend. */
+
+/* Blends src over dst pixel by pixel on the common top-left area; dst
+ * pixels outside it are untouched; dst alpha kept. */
+VOR_API void VorBitmapBlendBitmap(VorBitmap* dst, const VorBitmap* src, uint32_t mode,
+                                  float opacity);
+/* Each channel of the common area becomes srcWeight * src + dstWeight * dst,
+ * truncated and clamped (weights not normalised); dst alpha kept. */
+VOR_API void VorBitmapBlendBitmapSeparate(VorBitmap* dst, const VorBitmap* src, float dstWeight,
+                                          float srcWeight);
+/* Samples src bilinearly through the inverse of transform (source to
+ * destination coordinates) and blends it over every dst pixel; pixels that
+ * map outside the source become opaque white (alpha 255 too), others keep
+ * their alpha. */
+VOR_API void VorBitmapBlendBitmapTransform(VorBitmap* dst, const VorBitmap* src, uint32_t mode,
+                                           float opacity, const VorTransform* transform);
+/* dst = over blended onto base with the opacity of the mask's alpha,
+ * stretched bilinearly over the destination; base, over and dst share the
+ * destination's size; dst alpha kept. */
+VOR_API void VorBitmapBlendBitmapMask(VorBitmap* dst, const VorBitmap* base, const VorBitmap* over,
+                                      const VorBitmap* mask, uint32_t mode);
+/* dst = premultiplied over, un-premultiplied, blended onto base at the
+ * opacity of over's alpha; all three share the destination's size; dst
+ * alpha kept. */
+VOR_API void VorBitmapCompositePremultiplied(VorBitmap* dst, const VorBitmap* base,
+                                             const VorBitmap* over, uint32_t mode);
+/* Blends one colour over every pixel (through grey maps except in the
+ * colour mode, where the colour's alpha scales its saturation); alpha kept. */
+VOR_API void VorBitmapBlendWithColor(VorBitmap* bitmap, const VorColor* color, uint32_t mode,
+                                     float opacity);
+/* The same operation as VorBitmapBlendWithColor; alpha kept. */
+VOR_API void VorBitmapBlend(VorBitmap* bitmap, const VorColor* color, uint32_t mode,
+                            float opacity);
 
 /* ====================================================================== */
 /* Colour spaces                                                          */
 /* ====================================================================== */
 
+/* Packed L*a*b* pixel: r = L* x 2.55, g = a* + 127, b = b* + 127, each
+ * clamped to 0..255 and truncated; alpha untouched. HSV: hue degrees
+ * 0..360, saturation 0..1, value 0..255. HSL: hue, saturation, lightness
+ * all 0..1. */
+
+/* Fills the 256-entry table of linear light x 100 per sRGB level. */
+VOR_API void VorColorRGB2LABInitMapping(float table[256]);
+/* Fills the 1024-entry cube-root table: entry i = (i/1023)^(1/3). */
+VOR_API void VorColorRGB2LABInitMappingCbrt(float table[1024]);
+/* L*a*b* of the colour on the packed byte scale, unclamped, as doubles,
+ * linearised through the caller's table with exact cube roots. */
+VOR_API void VorColorRGB2LABDoublesWithMapping(const VorColor* color, double* L, double* a,
+                                               double* b, const float linear[256]);
+/* Packs the previous result into red, green, blue; alpha kept. */
+VOR_API void VorColorRGB2LABWithMapping(VorColor* color, const float linear[256]);
+/* L*a*b* on the packed byte scale as doubles, entirely table-driven. */
+VOR_API void VorColorRGB2LABDoublesWithCbrtMapping(const VorColor* color, double* L, double* a,
+                                                   double* b);
+/* Packs the table-driven L*a*b* into red, green, blue; alpha kept. */
+VOR_API void VorColorRGB2LAB(VorColor* color);
+/* Packed L*a*b* back to sRGB with lightness and chroma stretched by the
+ * scales; alpha kept. */
+VOR_API void VorColorLAB2RGBScaled(VorColor* color, double scaleL, double scaleA, double scaleB);
+/* Packed L*a*b* back to sRGB; alpha kept. */
+VOR_API void VorColorLAB2RGB(VorColor* color);
+/* HSV triple of the colour; the colour is only read. */
+VOR_API void VorColorRGB2HSV(const VorColor* color, float hsv[3]);
+/* HSL triple of the colour; the colour is only read. */
+VOR_API void VorColorRGB2HSL(const VorColor* color, float hsl[3]);
+/* Writes the RGB of an HSL triple into out with alpha 255. A hue above 1
+ * prints an error on standard output and gives the grey of the lightness
+ * offset alone. */
+VOR_API void VorColorHSL2RGB(const float hsl[3], VorColor* out);
+/* Every pixel to packed L*a*b* (table-driven); alpha kept. */
+VOR_API void VorBitmapConvertRGBToLAB(VorBitmap* bitmap);
+/* Every packed L*a*b* pixel back to sRGB with a* and b* scaled; alpha kept. */
+VOR_API void VorBitmapConvertLABToRBG(VorBitmap* bitmap, float scaleA, float scaleB);
+
 /* ====================================================================== */
 /* Colour matrices                                                        */
 /* ====================================================================== */
 
+/* Affine colour transform, 3 rows x 4 columns in memory order: output
+ * channel i (0 red, 1 green, 2 blue) = m[4i] R + m[4i+1] G + m[4i+2] B +
+ * m[4i+3], the offsets in 0..255 units. Diagonal: 0, 5, 10; offsets: 3, 7,
+ * 11. Every builder multiplies on the right, so the newest adjustment acts
+ * on the colour first. */
+typedef struct VorColorMatrix {
+    float m[12];
+} VorColorMatrix;
+
+VOR_API extern const VorColorMatrix VorColorMatrixIdentity; /* identity, zero offsets */
+
+/* Copies the 12 entries. */
+VOR_API void VorColorMatrixCopy(VorColorMatrix* dst, const VorColorMatrix* src);
+/* Copies VorColorMatrixIdentity into the matrix. */
+VOR_API void VorColorMatrixSetIdentity(VorColorMatrix* matrix);
+/* M = M x N; M and N may be the same record. */
+VOR_API void VorColorMatrixMultiply(VorColorMatrix* M, const VorColorMatrix* N);
+/* M = M x saturation(s): 1 keeps colours, 0 is grey by weights 0.213,
+ * 0.715, 0.072. */
+VOR_API void VorColorMatrixAdjSaturation(VorColorMatrix* matrix, float s);
+/* M = M x brightness b and contrast factor c (1, 1 = unchanged; contrast
+ * pivots about 128 b). */
+VOR_API void VorColorMatrixBrightnessContrast(VorColorMatrix* matrix, float brightness,
+                                              float contrast);
+/* VorColorMatrixBrightnessContrast with contrast 1. */
+VOR_API void VorColorMatrixBrightness(VorColorMatrix* matrix, float brightness);
+/* M = M x contrast about 128 with factor 1 + c (0 = unchanged). */
+VOR_API void VorColorMatrixContrast(VorColorMatrix* matrix, float c);
+/* Applies the matrix to red, green, blue of every pixel, rounded and
+ * clamped to 0..255; alpha kept. */
+VOR_API void VorBitmapColorMatrixTransform(VorBitmap* bitmap, const VorColorMatrix* matrix);
+/* Applies the matrix and blends the result over each pixel with the mode
+ * and opacity; a matrix without cross-channel terms takes full effect and
+ * ignores both. Alpha kept. */
+VOR_API void VorBitmapColorMatrixTransformAndBlendWithOriginal(VorBitmap* bitmap,
+                                                               const VorColorMatrix* matrix,
+                                                               uint32_t mode, float opacity);
+
 /* ====================================================================== */
 /* Histograms and histogram maps                                          */
 /* ====================================================================== */
+
+/* Per-channel tone map: map[c][i] is the output level of channel c (0 red,
+ * 1 green, 2 blue) for input level i. 768 bytes, no header; alpha has no
+ * table and is never mapped. */
+typedef struct VorHistMap {
+    uint8_t map[3][256];
+} VorHistMap;
+
+/* Per-channel pixel counts, red, green, blue; counts wrap modulo 2^32. */
+typedef struct VorHistogram {
+    uint32_t count[3][256];
+} VorHistogram;
+
+/* Per-channel cumulative distributions: cdf[c][i] is the fraction of pixels
+ * whose channel c is at most i. */
+typedef struct VorCDF {
+    double cdf[3][256];
+} VorCDF;
+
+/* map[c][i] = i for every channel. */
+VOR_API void VorHistMapSetIdentity(VorHistMap* map);
+/* Copies the three 256-byte arrays into the red, green and blue tables. */
+VOR_API void VorHistMapSet(VorHistMap* map, const uint8_t red[256], const uint8_t green[256],
+                           const uint8_t blue[256]);
+/* Composition in place: map[c][i] = second[c][map[c][i]] (map, then second). */
+VOR_API void VorHistMapMap(VorHistMap* map, const VorHistMap* second);
+/* map = map * amount + identity * (1 - amount), rounded half up and clamped;
+ * 1.0 leaves the map as it is, 0.0 gives the identity. */
+VOR_API void VorHistMapFade(VorHistMap* map, double amount);
+/* Maps red, green and blue of every pixel through the map; alpha kept. */
+VOR_API void VorBitmapHistogramTransform(VorBitmap* bitmap, const VorHistMap* map);
+/* Adds one count per pixel per channel to the histogram (no clearing);
+ * the pixels are only read. */
+VOR_API void VorHistogramBuild(const VorBitmap* bitmap, VorHistogram* histogram);
+/* One channel's normalised cumulative distribution; an empty histogram
+ * gives the uniform i/255. */
+VOR_API void VorHistogram2CDFChan(const uint32_t counts[256], double cdf[256]);
+/* VorHistogram2CDFChan for red, green and blue. */
+VOR_API void VorHistogram2CDF(const VorHistogram* histogram, VorCDF* cdf);
+/* The fractional level (0..255) at which one channel's CDF reaches p,
+ * interpolated linearly between entries. */
+VOR_API double VorCDFINV(const double cdf[256], double p);
+/* Gradient map: blends the opaque colour map[.][luminance] onto every pixel
+ * with the blend mode at opacity alpha; alpha bytes kept. */
+VOR_API void VorBitmapIntensityMap(VorBitmap* bitmap, const VorHistMap* map, uint32_t mode,
+                                   double alpha);
+/* Decodes {"r": [256 ints], "g": [...], "b": [...]}, each element 0..255,
+ * into map; 0 on any missing or malformed part (map then partly written). */
+VOR_API int VLPLHistMapfromHistMapVal(const yajl_val value, VorHistMap* map);
 
 /* ====================================================================== */
 /* Tone curves                                                            */

@@ -1,0 +1,327 @@
+// Conversions between sRGB pixels and CIE L*a*b* (D65), HSV and HSL, and
+// the in-place conversion of whole bitmaps to packed L*a*b* and back.
+#include <math.h>
+#include <stdio.h>
+
+#include <cstddef>
+#include <cstdint>
+
+#include "color/color_internal.h"
+#include "core/core_internal.h"
+
+namespace vorlite::color {
+namespace {
+
+using core::float_bits;
+
+constexpr float k_inv255 = float_bits(0x3B808081u);  // 1/255
+
+void fill_linear_table(float table[256]) {
+    for (int v = 0; v < 256; ++v) {
+        const float c = static_cast<float>(v) * k_inv255;
+        if (c > 0.04045f) {
+            // The sRGB curve's (c + 0.055) / 1.055 is taken as a product in
+            // double and only then narrowed for the single-precision power.
+            const float base =
+                static_cast<float>((static_cast<double>(c) + 0.055) * 0.9478672985781991);
+            table[v] = ::powf(base, 2.4f) * 100.0f;
+        } else {
+            table[v] = static_cast<float>(100 * v) * 0.000303527f;
+        }
+    }
+}
+
+void fill_cbrt_table(float table[1024]) {
+    table[0] = 0.0f;
+    for (int i = 1; i < 1024; ++i) {
+        table[i] = static_cast<float>(::pow(i * (1.0 / 1023.0), 0.3333333333333333));
+    }
+}
+
+// Computed in double and narrowed, so that the top entry is exactly 1.0.
+void fill_encoding_table(float table[1024]) {
+    for (int i = 0; i < 1024; ++i) {
+        const double t = i / 1023.0;
+        const double e = t <= 0.0031308 ? 12.92 * t : 1.055 * ::pow(t, 1.0 / 2.4) - 0.055;
+        table[i] = static_cast<float>(e);
+    }
+}
+
+// The companding of XYZ ratios: cube root above the CIE threshold, the
+// linear segment below it.
+constexpr double k_lab_epsilon = 0.008856;
+
+inline double lab_linear_segment(double t) { return 7.787 * t + 0.13793103448275862; }
+
+inline double cbrt_exact(double t) {
+    if (t > k_lab_epsilon) return static_cast<double>(::powf(static_cast<float>(t), 0.33333334f));
+    return lab_linear_segment(t);
+}
+
+// The index scales by 1024 over a table spaced 1/1023 apart: the slight
+// stretch is part of the library's L*a*b* and is kept.
+inline double cbrt_tabled(double t, const float* cbrt) {
+    if (t > k_lab_epsilon)
+        return t >= 1.0 ? 1.0 : static_cast<double>(cbrt[static_cast<int>(t * 1024.0)]);
+    return lab_linear_segment(t);
+}
+
+struct Lab {
+    double L, a, b;
+};
+
+template <typename CubeRoot>
+inline Lab rgb_to_lab(const VorColor& c, const float* linear, CubeRoot cube_root) {
+    const double rl = linear[c.r];
+    const double gl = linear[c.g];
+    const double bl = linear[c.b];
+    // sRGB-to-XYZ weights already divided by 100 and by the D65 white.
+    const double x = (gl * 0.00376234915 + rl * 0.00433891) + bl * 0.0018990604648;
+    const double y = (gl * 0.007152 + rl * 0.002126) + bl * 0.000722;
+    const double z = (gl * 0.00109475308 + rl * 0.000177255) + bl * 0.0087295537;
+    const double fx = cube_root(x);
+    const double fy = cube_root(y);
+    const double fz = cube_root(z);
+    return Lab{(116.0 * fy - 16.0) * 2.55, 500.0 * (fx - fy) + 127.0, 200.0 * (fy - fz) + 127.0};
+}
+
+inline Lab rgb_to_lab_tabled(const VorColor& c, const float* linear, const float* cbrt) {
+    return rgb_to_lab(c, linear, [cbrt](double t) { return cbrt_tabled(t, cbrt); });
+}
+
+inline void pack_lab(VorColor& c, const Lab& lab) {
+    c.r = core::store_truncated(lab.L);
+    c.g = core::store_truncated(lab.a);
+    c.b = core::store_truncated(lab.b);
+}
+
+inline float lab_inverse_compand(float f) {
+    const float cube = f * f * f;
+    if (cube > 0.008856f) return cube;
+    return (f - 0.13793103f) * 0.12841916f;
+}
+
+inline std::uint8_t encode_channel(float v, const float* encoding) {
+    if (!(v > 0.0f)) return 0;
+    if (v >= 1.0f) return 255;
+    const float e = encoding[static_cast<int>(v * 1024.0f)];
+    return static_cast<std::uint8_t>(static_cast<int>(e * 255.0f + 0.5f));
+}
+
+inline void lab_to_rgb(VorColor& c, double scale_l, double scale_a, double scale_b,
+                       const float* encoding) {
+    const double lb = c.r;
+    const double ab = c.g;
+    const double bb = c.b;
+    // 100/255 turns the packed byte back into L*; 1/116 starts the inverse.
+    const float fy =
+        static_cast<float>(((lb * 0.392156870078234) * scale_l + 16.0) * 0.008620689655172414);
+    const float fx = static_cast<float>(static_cast<double>(fy) + (scale_a * ab - 127.0) * 0.002);
+    const float fz = static_cast<float>(static_cast<double>(fy) + (127.0 - scale_b * bb) * 0.005);
+    const float x = lab_inverse_compand(fx) * 0.95047f;
+    const float y = lab_inverse_compand(fy);
+    const float z = lab_inverse_compand(fz) * 1.08883f;
+    const float r_lin = (x * 3.2406f + y * -1.5372f) + z * -0.4986f;
+    const float g_lin = (x * -0.9689f + y * 1.8758f) + z * 0.0415f;
+    const float b_lin = (x * 0.0557f + y * -0.204f) + z * 1.057f;
+    c.r = encode_channel(r_lin, encoding);
+    c.g = encode_channel(g_lin, encoding);
+    c.b = encode_channel(b_lin, encoding);
+}
+
+}  // namespace
+
+const LinearTable& linear_table() {
+    static const LinearTable table = [] {
+        LinearTable t;
+        fill_linear_table(t.data());
+        return t;
+    }();
+    return table;
+}
+
+const CbrtTable& cbrt_table() {
+    static const CbrtTable table = [] {
+        CbrtTable t;
+        fill_cbrt_table(t.data());
+        return t;
+    }();
+    return table;
+}
+
+const EncodingTable& encoding_table() {
+    static const EncodingTable table = [] {
+        EncodingTable t;
+        fill_encoding_table(t.data());
+        return t;
+    }();
+    return table;
+}
+
+}  // namespace vorlite::color
+
+using namespace vorlite::color;
+
+extern "C" {
+
+VOR_API void VorColorRGB2LABInitMapping(float table[256]) { fill_linear_table(table); }
+
+VOR_API void VorColorRGB2LABInitMappingCbrt(float table[1024]) { fill_cbrt_table(table); }
+
+VOR_API void VorColorRGB2LABDoublesWithMapping(const VorColor* color, double* L, double* a,
+                                               double* b, const float linear[256]) {
+    const Lab lab = rgb_to_lab(*color, linear, cbrt_exact);
+    *L = lab.L;
+    *a = lab.a;
+    *b = lab.b;
+}
+
+VOR_API void VorColorRGB2LABWithMapping(VorColor* color, const float linear[256]) {
+    pack_lab(*color, rgb_to_lab(*color, linear, cbrt_exact));
+}
+
+VOR_API void VorColorRGB2LABDoublesWithCbrtMapping(const VorColor* color, double* L, double* a,
+                                                   double* b) {
+    const Lab lab = rgb_to_lab_tabled(*color, linear_table().data(), cbrt_table().data());
+    *L = lab.L;
+    *a = lab.a;
+    *b = lab.b;
+}
+
+VOR_API void VorColorRGB2LAB(VorColor* color) {
+    pack_lab(*color, rgb_to_lab_tabled(*color, linear_table().data(), cbrt_table().data()));
+}
+
+VOR_API void VorColorLAB2RGBScaled(VorColor* color, double scaleL, double scaleA, double scaleB) {
+    lab_to_rgb(*color, scaleL, scaleA, scaleB, encoding_table().data());
+}
+
+VOR_API void VorColorLAB2RGB(VorColor* color) {
+    lab_to_rgb(*color, 1.0, 1.0, 1.0, encoding_table().data());
+}
+
+VOR_API void VorColorRGB2HSV(const VorColor* color, float hsv[3]) {
+    const int r = color->r;
+    const int g = color->g;
+    const int b = color->b;
+    const int max = r > g ? (r > b ? r : b) : (g > b ? g : b);
+    const int min = r < g ? (r < b ? r : b) : (g < b ? g : b);
+    if (max == 0) {
+        hsv[0] = hsv[1] = hsv[2] = 0.0f;
+        return;
+    }
+    const float delta = static_cast<float>(max - min);
+    if (delta == 0.0f) {
+        hsv[0] = 0.0f;
+        hsv[1] = 0.0f;
+        hsv[2] = static_cast<float>(max);
+        return;
+    }
+    float h;
+    if (r == max) {
+        h = static_cast<float>(g - b) / delta * 60.0f;
+    } else if (g == max) {
+        h = (static_cast<float>(b - r) / delta + 2.0f) * 60.0f;
+    } else {
+        h = (static_cast<float>(r - g) / delta + 4.0f) * 60.0f;
+    }
+    if (h < 0.0f) h += 360.0f;
+    hsv[0] = h;
+    hsv[1] = delta / static_cast<float>(max);
+    hsv[2] = static_cast<float>(max);
+}
+
+VOR_API void VorColorRGB2HSL(const VorColor* color, float hsl[3]) {
+    const float r = static_cast<float>(color->r) * k_inv255;
+    const float g = static_cast<float>(color->g) * k_inv255;
+    const float b = static_cast<float>(color->b) * k_inv255;
+    const float max = r > g ? (r > b ? r : b) : (g > b ? g : b);
+    const float min = r < g ? (r < b ? r : b) : (g < b ? g : b);
+    const float l = (max + min) * 0.5f;
+    if (max == min) {
+        hsl[0] = 0.0f;
+        hsl[1] = 0.0f;
+        hsl[2] = l;
+        return;
+    }
+    const float d = max - min;
+    const float s = l > 0.5f ? d / (2.0f - (max + min)) : d / (max + min);
+    float sector;
+    if (max == r) {
+        sector = (g - b) / d;
+        if (g < b) sector += 6.0f;
+    } else if (max == g) {
+        sector = (b - r) / d + 2.0f;
+    } else {
+        sector = (r - g) / d + 4.0f;
+    }
+    hsl[0] = sector * 0.16666667f;
+    hsl[1] = s;
+    hsl[2] = l;
+}
+
+VOR_API void VorColorHSL2RGB(const float hsl[3], VorColor* out) {
+    const float h = hsl[0];
+    const float s = hsl[1];
+    const float l = hsl[2];
+    const float h6 = h * 6.0f;
+    const float chroma = l > 0.5f ? (s + s) * (1.0f - l) : (l * s) + (l * s);
+    const float m = static_cast<float>(static_cast<double>(l) - static_cast<double>(chroma) * 0.5);
+    float rc = 0.0f;
+    float gc = 0.0f;
+    float bc = 0.0f;
+    // Anything past the last sector (NaN included) is reported and drawn as
+    // the grey m; the secondary component is only needed inside the wheel,
+    // where folding h6 into 0..1 takes at most three subtractions.
+    if (h6 <= 6.0f) {
+        float m2 = h6;
+        while (m2 >= 2.0f) m2 -= 2.0f;
+        if (m2 >= 1.0f) m2 = 2.0f - m2;
+        const float x = m2 * chroma;
+        if (h6 < 1.0f) {
+            rc = chroma, gc = x;
+        } else if (h6 < 2.0f) {
+            rc = x, gc = chroma;
+        } else if (h6 < 3.0f) {
+            gc = chroma, bc = x;
+        } else if (h6 < 4.0f) {
+            gc = x, bc = chroma;
+        } else if (h6 < 5.0f) {
+            rc = x, bc = chroma;
+        } else {
+            rc = chroma, bc = x;
+        }
+    } else {
+        fputs("There was an error in VorColorHSL2RGB...The hPrime value was more than 6 somehow.",
+              stdout);
+    }
+    out->r = vorlite::core::store_rounded(static_cast<double>((rc + m) * 255.0f));
+    out->g = vorlite::core::store_rounded(static_cast<double>((gc + m) * 255.0f));
+    out->b = vorlite::core::store_rounded(static_cast<double>((bc + m) * 255.0f));
+    out->a = 255;
+}
+
+VOR_API void VorBitmapConvertRGBToLAB(VorBitmap* bitmap) {
+    const float* linear = linear_table().data();
+    const float* cbrt = cbrt_table().data();
+    std::uint8_t* p = bitmap->data;
+    const std::size_t n = vorlite::core::pixel_count(*bitmap);
+    for (std::size_t i = 0; i < n; ++i, p += 4) {
+        VorColor c = vorlite::core::load_pixel(p);
+        pack_lab(c, rgb_to_lab_tabled(c, linear, cbrt));
+        vorlite::core::store_pixel(p, c);
+    }
+}
+
+VOR_API void VorBitmapConvertLABToRBG(VorBitmap* bitmap, float scaleA, float scaleB) {
+    const float* encoding = encoding_table().data();
+    std::uint8_t* p = bitmap->data;
+    const std::size_t n = vorlite::core::pixel_count(*bitmap);
+    for (std::size_t i = 0; i < n; ++i, p += 4) {
+        VorColor c = vorlite::core::load_pixel(p);
+        lab_to_rgb(c, 1.0, static_cast<double>(scaleA), static_cast<double>(scaleB), encoding);
+        vorlite::core::store_pixel(p, c);
+    }
+}
+
+}  // extern "C"

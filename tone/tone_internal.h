@@ -1,0 +1,76 @@
+// Internal helpers of the tone folder shared with other folders.
+#ifndef VORLITE_TONE_INTERNAL_H
+#define VORLITE_TONE_INTERNAL_H
+
+#include <array>
+#include <cstdint>
+#include <cstdlib>
+#include <memory>
+
+#include "zentra_vorlite.h"
+
+namespace vorlite::tone {
+
+// Histograms and histogram maps, tone curves: a single 256-level curve
+// written into the red, green and blue tables of a map and applied to the
+// bitmap with VorBitmapHistogramTransform; alpha is kept.
+using Curve = std::array<std::uint8_t, 256>;
+void apply_curve(VorBitmap* bitmap, const Curve& curve);
+
+// Random numbers: one generator step and the uniform float of a state,
+// inline so that per-pixel grain loops run without a call per draw. They
+// are exactly the steps of VorRNGNextInt and VorRNGNextFloat.
+constexpr std::uint32_t rng_step(std::uint32_t state) { return state * 69069u + 1u; }
+inline float rng_unit_float(std::uint32_t state) {
+    // Round the state to float first, then scale by 2^-32 (exact): states
+    // from 4294967168 up round to 2^32 and give exactly 1.0.
+    return static_cast<float>(state) * 0x1p-32f;
+}
+
+// Integral images: the sum over the inclusive rectangle x0..x1, y0..y1 of a
+// width-wide sum table, modulo 2^32 (four reads whatever the box size).
+inline std::uint32_t box_sum(const std::uint32_t* sums, std::uint32_t width, std::uint32_t x0,
+                             std::uint32_t y0, std::uint32_t x1, std::uint32_t y1) {
+    const auto at = [&](std::uint32_t x, std::uint32_t y) {
+        return sums[static_cast<std::size_t>(y) * width + x];
+    };
+    std::uint32_t sum = at(x1, y1);
+    if (y0 > 0) sum -= at(x1, y0 - 1);
+    if (x0 > 0) sum -= at(x0 - 1, y1);
+    if (x0 > 0 && y0 > 0) sum += at(x0 - 1, y0 - 1);
+    return sum;
+}
+
+// Sharpening and soft focus: the shape of one box-hybrid pass for a bitmap
+// of the given size and amount. The pass sums 2r + 1 boxes of b pixels,
+// box r covering x - m .. x + m; sigma is the Gaussian's deviation in boxes.
+struct BoxHybridShape {
+    bool sharpen;  // false: the pass returns the blur itself
+    std::int32_t radius;
+    std::int32_t box;
+    std::int32_t half_box;
+    float sigma;
+};
+// False when the scaled amount is 0, so the pass leaves the bitmap alone.
+bool box_hybrid_shape(std::uint32_t width, std::uint32_t height, float amount,
+                      BoxHybridShape* shape);
+// The 2r + 1 box weights on the 4096 fixed-point scale, truncated.
+void box_hybrid_weights(const BoxHybridShape& shape, std::int32_t* weights);
+
+// Auto colours and auto enhance: the per-channel histogram of a bitmap and
+// its cumulative distribution, held in zeroed working buffers that are
+// released with the record.
+struct FreeDeleter {
+    void operator()(void* p) const { std::free(p); }
+};
+struct ChannelStatistics {
+    std::unique_ptr<VorHistogram, FreeDeleter> histogram;
+    std::unique_ptr<VorCDF, FreeDeleter> cdf;
+};
+// Allocates, then fills the histogram and the CDF of the bitmap; false,
+// with every buffer already allocated released again, when memory runs out.
+bool gather_channel_statistics(const VorBitmap* bitmap, ChannelStatistics* statistics);
+
+}  // namespace vorlite::tone
+
+#endif
