@@ -421,29 +421,186 @@ VOR_API int VLPLHistMapfromHistMapVal(const yajl_val value, VorHistMap* map);
 /* Tone curves                                                            */
 /* ====================================================================== */
 
+/* S-curve with exponent contrast on each half of the range (0 stands for
+ * 1e-8); the upper half ends at 254. Red, green, blue mapped; alpha kept. */
+VOR_API void VorBitmapContrastCurve(VorBitmap* bitmap, float contrast);
+/* Power curve level = 255 * (level / 255)^gamma on red, green, blue;
+ * alpha kept. */
+VOR_API void VorBitmapGamma(VorBitmap* bitmap, float gamma);
+
 /* ====================================================================== */
 /* Adjustment tools                                                       */
 /* ====================================================================== */
+
+/* Slider adjustments of the whole bitmap: value nominally -100..100, 0
+ * meaning no change. The pointer argument is the tool's parameter record,
+ * passed through and never read. */
+
+/* Value clamped to -100..100: below 0 a gamma curve of -log2(0.5 + v/400)
+ * darkens red, green, blue; from 0 up a brightness matrix of 1 + 0.006 v
+ * scales them; alpha kept. */
+VOR_API void VorToolBrightness(VorBitmap* bitmap, const void* params, double value);
+/* Value clamped to -100..100: contrast curve of exponent 3.1^(v/100) on
+ * red, green, blue; alpha kept. */
+VOR_API void VorToolContrast(VorBitmap* bitmap, const void* params, double value);
+/* Value clamped to -100..100: saturation matrix of factor 1 + v/100 (0 is
+ * grey, 2 doubles); alpha kept. */
+VOR_API void VorToolSaturation(VorBitmap* bitmap, const void* params, double value);
+/* Value unclamped: per-channel gains, warmer (more red, less blue) above 0,
+ * cooler below; alpha kept. */
+VOR_API void VorToolWarmth(VorBitmap* bitmap, const void* params, double value);
+/* Value unclamped: two-pass box-hybrid filter at that amount, sharpening
+ * above 0 and blurring below; alpha kept. */
+VOR_API void VorToolSharpness(VorBitmap* bitmap, const void* params, double value);
 
 /* ====================================================================== */
 /* Auto colours                                                           */
 /* ====================================================================== */
 
+/* Per-channel levels: stretches each of red, green and blue so that its
+ * 0.5th percentile becomes 0 and its 99.5th percentile, or the ceiling's
+ * channel if that is higher, becomes 255; fade 0 leaves the pixels as they
+ * are, 1 applies the full stretch. Alpha kept. */
+VOR_API void VorAutoColorsFadeMaxColor(VorBitmap* bitmap, double fade, const VorColor* ceiling);
+/* VorAutoColorsFadeMaxColor with a black ceiling, which never applies;
+ * alpha kept. */
+VOR_API void VorAutoColorsFade(VorBitmap* bitmap, double fade);
+/* The full per-channel stretch (fade 1, no ceiling); alpha kept. */
+VOR_API void VorAutoColors(VorBitmap* bitmap);
+/* Adapter for hosts only (no document name reaches it): {"color": colour}
+ * is the ceiling and the run's strength the fade; 0, with the pixels
+ * untouched, when the colour does not decode. */
+VOR_API int VLPLRunAutoColorsFadeMaxProcessor(const yajl_val parameters, VorBitmap* bitmap,
+                                              const VLPLRunOptions* options);
+
 /* ====================================================================== */
 /* Integral images and local contrast                                     */
 /* ====================================================================== */
+
+/* Integral images are W x H arrays of unsigned 32-bit sums, row-major:
+ * entry (x, y) sums every value at or above and left of (x, y), modulo
+ * 2^32. */
+
+/* Fills the red, green and blue sum tables (W x H each) from the pixels,
+ * which are only read; returns the number of rows processed. */
+VOR_API uint32_t VorBuildIntegralImage(const VorBitmap* bitmap, uint32_t* red, uint32_t* green,
+                                       uint32_t* blue);
+/* Fills one W x H sum table with the grey level of each pixel
+ * (0.2 red + 0.7 green + 0.1 blue, rounded); the pixels are only read. */
+VOR_API void VorBuildIntegralImageGray(const VorBitmap* bitmap, uint32_t* sums);
+/* Sum over the inclusive rectangle x0..x1, y0..y1 of a W-wide sum table
+ * (height is not read), modulo 2^32. */
+VOR_API uint32_t VorSumBoxFromIntegralImage(const uint32_t* sums, uint32_t width, uint32_t height,
+                                            uint32_t x0, uint32_t y0, uint32_t x1, uint32_t y1);
+/* Gaussian smoothing in place of n floats over the whole line (no kernel
+ * cut-off); values stay as they were if the working buffer cannot be had. */
+VOR_API void VorLineSmooth1D(float* values, uint32_t n, int32_t sigma);
+/* Applies the map to each pixel through its neighbourhood's mean grey level
+ * and amplifies its detail; red, green, blue rewritten, alpha set to 255.
+ * Left untouched if the working buffers cannot be had. */
+VOR_API void VorBlurHistMap(VorBitmap* bitmap, const VorHistMap* map);
+/* Local contrast ("clarity"): a lifting curve derived from the green
+ * histogram, applied with VorBlurHistMap; alpha set to 255. */
+VOR_API void VorLocalContrastEnhanceProcessor(VorBitmap* bitmap);
+/* VorLocalContrastEnhanceProcessor between the accelerated-path hooks. */
+VOR_API void VorLocalContrastEnhance(VorBitmap* bitmap);
+/* VorLocalContrastEnhanceProcessor; the second pointer is not read. */
+VOR_API void VorEnhanceClarity(VorBitmap* bitmap, const void* unused);
 
 /* ====================================================================== */
 /* Sharpening and soft focus                                              */
 /* ====================================================================== */
 
+/* Box-hybrid filter: each pass blurs along rows (X) or columns (Y) with
+ * 2r + 1 boxes weighted like a Gaussian of deviation (width + height) *
+ * |amount| * 2.5e-5 pixels; a positive amount sharpens with the blur, a
+ * negative one returns the blur. An integral line is 4 words per pixel: running sums of
+ * red, green and blue, the fourth word unused. */
+
+/* Fills line (4 * width words) with the running sums along row y; pixels
+ * only read. */
+VOR_API void VorBuildIntegralLineX(const VorBitmap* bitmap, uint32_t y, uint32_t* line);
+/* Fills line (4 * height words) with the running sums down column x;
+ * pixels only read. */
+VOR_API void VorBuildIntegralLineY(const VorBitmap* bitmap, uint32_t x, uint32_t* line);
+/* erfc(z) by a Chebyshev expansion for z >= 0; 0 for z < 0. */
+VOR_API float VorMathErfccheb(float z);
+/* erf(x) from VorMathErfccheb. */
+VOR_API float VorMathErf(float x);
+/* Cumulative distribution at x of a centred normal of deviation sigma. */
+VOR_API float VorMathNormalCDF(float x, float sigma);
+/* One horizontal pass on red, green, blue in place; alpha kept. */
+VOR_API void VorBoxHybridSharpenX(VorBitmap* bitmap, float amount);
+/* One vertical pass on red, green, blue in place; alpha kept. */
+VOR_API void VorBoxHybridSharpenY(VorBitmap* bitmap, float amount);
+/* The X pass, then the Y pass on its result; alpha kept. */
+VOR_API void VorConvolutionEffectBoxHybridSharpen(VorBitmap* bitmap, float amount);
+/* Both passes unless amount is 0; alpha kept. */
+VOR_API void VorSharpness(VorBitmap* bitmap, float amount);
+/* Both passes inside the accelerated-path hooks; alpha kept. */
+VOR_API void VorConvolutionEffectKipSharpen(VorBitmap* bitmap, float amount);
+/* Both passes, without the hooks; alpha kept. */
+VOR_API void VorConvolutionProcessorKipSharpen(VorBitmap* bitmap, float amount);
+/* Filters a copy with both passes and blends it back over the bitmap with
+ * the blend mode at opacity alpha; nothing when amount or alpha is 0 or
+ * the copy cannot be made; alpha bytes kept. */
+VOR_API void VorConvolutionProcessorSharpenAndBlendWithOriginal(VorBitmap* bitmap, float amount,
+                                                                float alpha, uint32_t mode);
+/* Blurs by (width + height) / 400 and adds the original back: 0.5 x blur +
+ * 0.6 x original per channel; alpha kept. 0, unchanged, when the working
+ * copy cannot be made, else 1. */
+VOR_API int VorConvolutionEffectSoftFocus(VorBitmap* bitmap);
+/* Both passes at amount -5: a light blur of red, green, blue; alpha kept. */
+VOR_API void VorConvolutionAntialiasGL(VorBitmap* bitmap);
+
 /* ====================================================================== */
 /* Random numbers and noise                                               */
 /* ====================================================================== */
 
+/* Linear congruential generator: each step is state = state * 69069 + 1
+ * modulo 2^32. Every seeded effect depends on this exact sequence. */
+typedef struct VorRNG {
+    uint32_t seed;  /* the seed last given; never read by the draws */
+    uint64_t state; /* current state; its upper 32 bits stay 0 */
+} VorRNG;
+
+/* seed = state = the given value. */
+VOR_API void VorRNGSeed(VorRNG* rng, uint32_t seed);
+/* Seeds from the C library's lrand48 (the one non-reproducible entry). */
+VOR_API void VorRNGInit(VorRNG* rng);
+/* One step; returns the new state. */
+VOR_API uint32_t VorRNGNextInt(VorRNG* rng);
+/* The state reached from seed after n steps; n = 0 gives seed. */
+VOR_API uint32_t VorRNGNextSeedN(uint32_t seed, uint32_t n);
+/* One step; the state as a float times 2^-32, in [0, 1] (1 included). */
+VOR_API float VorRNGNextFloat(VorRNG* rng);
+/* Standard normal draw (Box-Muller, cosine half); two draws or more. */
+VOR_API float VorRNGNextFloatNormal(VorRNG* rng);
+/* Standard Laplace draw by the inverse distribution; one draw. */
+VOR_API float VorRNGNextFloatLaplace(VorRNG* rng);
+/* Monochrome grain: one uniform offset of up to +-intensity * 255 per pixel
+ * added to red, green and blue alike (clamped); alpha set to 255. */
+VOR_API void VorBitmapAddNoise(VorBitmap* bitmap, float intensity, uint32_t seed);
+/* Colour grain: an offset drawn for red, green and blue separately
+ * (clamped); alpha set to 255. */
+VOR_API void VorBitmapAddChannelIndependentNoise(VorBitmap* bitmap, float intensity,
+                                                 uint32_t seed);
+
 /* ====================================================================== */
 /* Auto enhance                                                           */
 /* ====================================================================== */
+
+/* Brightens levels that hold more of the image than an even spread would,
+ * by a gain curve from the luminance histogram applied through each
+ * pixel's luminance to green, with red and blue following. Mode 0: gain
+ * exponent 0.8; 2: only lifts, exponent 0.65; 3: contrast curve 0.5 first,
+ * then as 1; 1 and any other value: an exponent that falls toward white.
+ * Alpha kept. */
+VOR_API void VorAutoEnhance(VorBitmap* bitmap, int mode);
+/* Colour-cast correction in packed L*a*b*: pulls the a* and b* channels
+ * toward neutral by factors from their 10th and 90th percentiles, and
+ * converts back to sRGB (levels may shift by the round trip). Alpha kept. */
+VOR_API void VorLabCorrect(VorBitmap* bitmap);
 
 #ifdef __cplusplus
 }

@@ -1,0 +1,100 @@
+// Entry points built on the box-hybrid filter: two-pass sharpening and
+// blurring, a sharpened copy blended back over the original, soft focus,
+// the light anti-aliasing blur and the "sharpness" processor.
+#include "core/core_internal.h"
+#include "proclist/proclist_internal.h"
+
+namespace {
+
+// A same-size copy of the bitmap's pixels, released on every return.
+class WorkingCopy {
+public:
+    WorkingCopy() = default;
+    WorkingCopy(const WorkingCopy&) = delete;
+    WorkingCopy& operator=(const WorkingCopy&) = delete;
+    ~WorkingCopy() { VorBitmapFree(&copy_); }
+
+    bool make(const VorBitmap& bitmap) {
+        return VorBitmapBuild(&copy_, bitmap.width, bitmap.height) != 0 &&
+               VorBitmapCopy(&copy_, &bitmap) != 0;
+    }
+    VorBitmap* bitmap() { return &copy_; }
+
+private:
+    VorBitmap copy_{nullptr, 0, 0};
+};
+
+// Amount -100 scales to a blur of deviation (width + height) / 400 pixels.
+constexpr float kSoftFocusAmount = -100.0f;
+// The blurred image at half weight plus the original at 0.6: the weights
+// add up to 1.1, so the glow also lifts the whole picture slightly.
+constexpr float kSoftFocusBlurWeight = 0.5f;
+constexpr float kSoftFocusOriginalWeight = 0.6f;
+// A blur of deviation (width + height) / 8000 pixels: just enough to soften
+// jagged edges.
+constexpr float kAntialiasAmount = -5.0f;
+
+}  // namespace
+
+extern "C" {
+
+VOR_API void VorSharpness(VorBitmap* bitmap, float amount) {
+    if (amount == 0.0f) return;
+    VorConvolutionEffectBoxHybridSharpen(bitmap, amount);
+}
+
+VOR_API void VorConvolutionEffectKipSharpen(VorBitmap* bitmap, float amount) {
+    VorBitmapBeginGLEffectIfEnabled(bitmap);
+    VorConvolutionEffectBoxHybridSharpen(bitmap, amount);
+    VorBitmapEndGLEffectIfEnabled(bitmap);
+}
+
+VOR_API void VorConvolutionProcessorKipSharpen(VorBitmap* bitmap, float amount) {
+    VorConvolutionEffectBoxHybridSharpen(bitmap, amount);
+}
+
+VOR_API void VorConvolutionProcessorSharpenAndBlendWithOriginal(VorBitmap* bitmap, float amount,
+                                                                float alpha, uint32_t mode) {
+    if (amount == 0.0f || alpha == 0.0f) return;
+    WorkingCopy sharpened;
+    if (!sharpened.make(*bitmap)) return;
+    VorConvolutionEffectBoxHybridSharpen(sharpened.bitmap(), amount);
+    VorBitmapBlendBitmap(bitmap, sharpened.bitmap(), mode, alpha);
+}
+
+VOR_API int VorConvolutionEffectSoftFocus(VorBitmap* bitmap) {
+    VorBitmapBeginGLEffectIfEnabled(bitmap);
+    WorkingCopy original;
+    if (!original.make(*bitmap)) return 0;
+    VorConvolutionEffectBoxHybridSharpen(bitmap, kSoftFocusAmount);
+    VorBitmapBlendBitmapSeparate(bitmap, original.bitmap(), kSoftFocusBlurWeight,
+                                 kSoftFocusOriginalWeight);
+    VorBitmapEndGLEffectIfEnabled(bitmap);
+    return 1;
+}
+
+VOR_API void VorConvolutionAntialiasGL(VorBitmap* bitmap) {
+    VorConvolutionEffectBoxHybridSharpen(bitmap, kAntialiasAmount);
+}
+
+VOR_API int VLPLRunSharpnessProcessor(const yajl_val parameters, VorBitmap* bitmap,
+                                      const VLPLRunOptions* options) {
+    namespace proclist = vorlite::proclist;
+    double amount = 0.0;
+    double alpha = 0.0;
+    if (!proclist::member_double(parameters, "amount", &amount)) return 0;
+    if (!proclist::member_double(parameters, "alpha", &alpha)) return 0;
+    int mode = 0;
+    if (!VLPLBlendModeFromBlendModeVal(proclist::member(parameters, "blendMode", yajl_t_any),
+                                       &mode)) {
+        return 0;
+    }
+    // The run's strength fades the sharpened copy in; the filter itself
+    // always runs at the document's amount.
+    const float opacity = static_cast<float>(alpha * options->strength);
+    VorConvolutionProcessorSharpenAndBlendWithOriginal(bitmap, static_cast<float>(amount), opacity,
+                                                       static_cast<uint32_t>(mode));
+    return 1;
+}
+
+}  // extern "C"
