@@ -32,12 +32,7 @@ for stage in "${stages[@]}"; do
       ;;
     sanitize)
       banner "suite under AddressSanitizer and UndefinedBehaviorSanitizer"
-      # The slow unwinder sees through yajl's frames, so the loader's one
-      # deliberate leak can be suppressed by name; every other leak fails.
-      ASAN_OPTIONS=detect_leaks=1:fast_unwind_on_malloc=0 \
-        LSAN_OPTIONS=suppressions=$root/scripts/lsan.supp:print_suppressions=0 \
-        UBSAN_OPTIONS=print_stacktrace=1 \
-        suite sanitize -DVORLITE_SANITIZE=address,undefined
+      suite sanitize -DVORLITE_SANITIZE=address,undefined
       ;;
     arm)
       banner "suite on 32-bit ARM hard-float under qemu-arm"
