@@ -24,7 +24,7 @@ export ASAN_OPTIONS=fast_unwind_on_malloc=0:detect_leaks=1
 export LSAN_OPTIONS=suppressions=$root/scripts/lsan.supp:print_suppressions=0
 export UBSAN_OPTIONS=print_stacktrace=1:halt_on_error=1
 status=0
-"$dir/fuzz/fuzz_effect_document" -max_total_time="$seconds" -max_len=4096 -rss_limit_mb=4096 \
+"$dir/fuzz/fuzz_effect_document" -max_total_time="$seconds" -max_len=8192 -rss_limit_mb=4096 \
   -timeout=10 -print_final_stats=1 -dict="$root/fuzz/effect_document.dict" \
   -artifact_prefix="$dir/findings/" "$dir/corpus" >"$dir/fuzz.log" 2>&1 || status=$?
 grep -E '^(#[0-9]+ +DONE|Done |stat::number_of_executed_units|stat::peak_rss_mb)' "$dir/fuzz.log" || true
