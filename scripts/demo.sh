@@ -1,9 +1,22 @@
 #!/usr/bin/env bash
-# Builds the library and runs the example host: it loads an effect document
-# and runs it on a generated bitmap.
+# The main job: builds the vorlite tool, runs every bundled look of
+# examples/effects/ on the sample photographs and writes before-and-after
+# comparisons (original left, look right) to out/.
 set -euo pipefail
 cd "$(dirname "$0")/.."
-"$PWD/scripts/setup.sh"
+"$PWD/scripts/setup.sh" --photos
 cmake -S . -B build/native -DCMAKE_BUILD_TYPE=Release >/dev/null
-cmake --build build/native -j"$(nproc 2>/dev/null || echo 2)" --target run_effect >/dev/null
-build/native/examples/run_effect
+cmake --build build/native -j"$(nproc 2>/dev/null || echo 2)" --target vorlite >/dev/null
+tool=build/native/cli/vorlite
+"$tool" info | head -n 2
+
+mkdir -p out
+count=0
+for look in examples/effects/*.json; do
+  name=$(basename "$look" .json)
+  for photo in build/photos/*.png build/photos/*.jpg; do
+    "$tool" apply "$look" "$photo" "out/$(basename "${photo%.*}")-$name.jpg" --compare --seed 1 --quality 88
+    count=$((count + 1))
+  done
+done
+echo "demo: $count before-and-after comparisons of $(ls examples/effects/*.json | wc -l) looks in $PWD/out/"

@@ -1,0 +1,62 @@
+// The tool's commands. Each returns the exit status (0 done, 1 a file
+// failed) and throws Failure or UsageError for the one error line of a
+// command that stops.
+#pragma once
+
+#include <cstdint>
+#include <filesystem>
+#include <optional>
+#include <string>
+
+#include "zentra_vorlite.h"
+
+namespace vorlite::cli {
+
+inline constexpr int kDefaultQuality = 90;
+
+// What an effect run is given: the library's run options.
+struct RunSettings {
+    uint32_t seed = 0;
+    double strength = 1.0;
+    bool no_borders = false;
+    VLPLRunOptions options() const;
+};
+
+struct ApplyArgs {
+    std::filesystem::path effect, input, output;
+    RunSettings run;
+    bool compare = false;
+    int quality = kDefaultQuality;
+};
+
+// Slider values, nominally -100..100, 0 meaning unchanged.
+struct AdjustArgs {
+    std::filesystem::path input, output;
+    std::optional<double> brightness, contrast, saturation, warmth, sharpness;
+    int quality = kDefaultQuality;
+};
+
+struct AutoArgs {
+    std::filesystem::path input, output;
+    std::optional<int> enhance;   // auto-enhance mode 0..3
+    std::optional<double> colors; // levels fade 0..1
+    bool lab_correct = false;
+    bool clarity = false;
+    int quality = kDefaultQuality;
+};
+
+struct BatchArgs {
+    std::filesystem::path effect, input_dir, output_dir;
+    RunSettings run;
+    unsigned jobs = 1;
+    int quality = kDefaultQuality;
+};
+
+int run_apply(const ApplyArgs& args);
+int run_check(const std::filesystem::path& effect);
+int run_adjust(const AdjustArgs& args);
+int run_auto(const AutoArgs& args);
+int run_batch(const BatchArgs& args);
+int run_info();
+
+}  // namespace vorlite::cli

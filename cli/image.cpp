@@ -1,0 +1,85 @@
+// Format by name, orientation, side-by-side comparisons.
+#include "image.h"
+
+#include <algorithm>
+#include <cctype>
+#include <cerrno>
+#include <cstring>
+#include <fstream>
+#include <iterator>
+
+namespace vorlite::cli {
+
+std::optional<Format> format_for_path(const std::filesystem::path& path) {
+    std::string ext = path.extension().string();
+    std::transform(ext.begin(), ext.end(), ext.begin(),
+                   [](unsigned char c) { return static_cast<char>(std::tolower(c)); });
+    if (ext == ".png") return Format::png;
+    if (ext == ".jpg" || ext == ".jpeg") return Format::jpeg;
+    return std::nullopt;
+}
+
+Format require_format(const std::filesystem::path& path) {
+    if (auto format = format_for_path(path)) return *format;
+    throw UsageError(path.string() + ": unsupported image type (use .png, .jpg or .jpeg)");
+}
+
+bool is_opaque(const Image& image) {
+    for (std::size_t i = 3; i < image.rgba.size(); i += 4) {
+        if (image.rgba[i] != 255) return false;
+    }
+    return true;
+}
+
+Image orient_upright(const Image& image, int exif_orientation) {
+    if (exif_orientation < 2 || exif_orientation > 8) return image;
+    const uint32_t w = image.width;
+    const uint32_t h = image.height;
+    // Orientations 5 to 8 store the picture turned by a quarter: rows of the
+    // file are columns of the upright photo.
+    const bool turned = exif_orientation >= 5;
+    Image out(turned ? h : w, turned ? w : h);
+    for (uint32_t y = 0; y < h; ++y) {
+        for (uint32_t x = 0; x < w; ++x) {
+            uint32_t dx = x;
+            uint32_t dy = y;
+            switch (exif_orientation) {
+                case 2: dx = w - 1 - x; break;
+                case 3: dx = w - 1 - x; dy = h - 1 - y; break;
+                case 4: dy = h - 1 - y; break;
+                case 5: dx = y; dy = x; break;
+                case 6: dx = h - 1 - y; dy = x; break;
+                case 7: dx = h - 1 - y; dy = w - 1 - x; break;
+                case 8: dx = y; dy = w - 1 - x; break;
+            }
+            std::memcpy(out.pixel(dx, dy), image.pixel(x, y), 4);
+        }
+    }
+    return out;
+}
+
+Image side_by_side(const Image& left, const Image& right) {
+    const uint32_t gap = std::max<uint32_t>(4, std::max(left.width, right.width) / 100);
+    Image out(left.width + gap + right.width, std::max(left.height, right.height));
+    std::fill(out.rgba.begin(), out.rgba.end(), uint8_t{255});
+    auto place = [&out](const Image& part, uint32_t x0) {
+        for (uint32_t y = 0; y < part.height; ++y) {
+            std::memcpy(out.pixel(x0, y), part.pixel(0, y), std::size_t{4} * part.width);
+        }
+    };
+    place(left, 0);
+    place(right, left.width + gap);
+    return out;
+}
+
+std::string read_file(const std::filesystem::path& path) {
+    std::ifstream in(path, std::ios::binary);
+    if (!in) throw Failure(path.string() + ": cannot open: " + std::strerror(errno));
+    std::error_code ec;
+    if (std::filesystem::is_directory(path, ec)) throw Failure(path.string() + ": is a folder, not a file");
+    std::string text{std::istreambuf_iterator<char>(in), std::istreambuf_iterator<char>()};
+    if (in.bad()) throw Failure(path.string() + ": cannot read: " + std::strerror(errno));
+    return text;
+}
+
+}  // namespace vorlite::cli

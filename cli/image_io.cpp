@@ -1,0 +1,244 @@
+// PNG through libpng, JPEG through libjpeg-turbo, orientation through libexif.
+#include <csetjmp>
+#include <cstdio>
+#include <cstdlib>
+#include <cstring>
+#include <cerrno>
+#include <fstream>
+
+// jpeglib.h needs size_t and FILE declared before it.
+#include <jpeglib.h>
+#include <jerror.h>
+#include <libexif/exif-data.h>
+#include <png.h>
+
+#include "image.h"
+
+namespace vorlite::cli {
+namespace {
+
+// The library's largest bitmap; anything bigger could not be processed.
+constexpr uint64_t kMaxPixels = 0x3FFFFFFF;
+
+void check_size(const std::filesystem::path& path, uint64_t width, uint64_t height) {
+    if (width == 0 || height == 0) throw Failure(path.string() + ": the image has no pixels");
+    if (width * height > kMaxPixels) {
+        throw Failure(path.string() + ": " + std::to_string(width) + " x " + std::to_string(height) +
+                      " pixels is more than one bitmap can hold");
+    }
+}
+
+void write_file(const std::filesystem::path& path, const void* data, std::size_t size) {
+    std::ofstream out(path, std::ios::binary | std::ios::trunc);
+    if (!out) throw Failure(path.string() + ": cannot create: " + std::strerror(errno));
+    out.write(static_cast<const char*>(data), static_cast<std::streamsize>(size));
+    out.close();
+    if (!out) {
+        const int error = errno;
+        std::error_code ignored;
+        std::filesystem::remove(path, ignored);
+        throw Failure(path.string() + ": cannot write: " + std::strerror(error));
+    }
+}
+
+// ---- PNG ---------------------------------------------------------------
+
+Image decode_png(const std::string& file, const std::filesystem::path& path) {
+    png_image png{};
+    png.version = PNG_IMAGE_VERSION;
+    if (!png_image_begin_read_from_memory(&png, file.data(), file.size())) {
+        throw Failure(path.string() + ": not a readable PNG file (" + png.message + ")");
+    }
+    // 16-bit files without a gamma chunk hold sRGB levels like 8-bit ones,
+    // not linear light.
+    png.flags |= PNG_IMAGE_FLAG_16BIT_sRGB;
+    png.format = PNG_FORMAT_RGBA;
+    try {
+        check_size(path, png.width, png.height);
+        Image image(png.width, png.height);
+        if (!png_image_finish_read(&png, nullptr, image.rgba.data(), 0, nullptr)) {
+            throw Failure(path.string() + ": not a readable PNG file (" + png.message + ")");
+        }
+        return image;
+    } catch (...) {
+        png_image_free(&png);
+        throw;
+    }
+}
+
+std::vector<uint8_t> encode_png(const Image& image, const std::filesystem::path& path) {
+    png_image png{};
+    png.version = PNG_IMAGE_VERSION;
+    png.width = image.width;
+    png.height = image.height;
+    std::vector<uint8_t> rgb;
+    const void* pixels = image.rgba.data();
+    if (is_opaque(image)) {
+        png.format = PNG_FORMAT_RGB;
+        rgb.resize(std::size_t{3} * image.width * image.height);
+        for (std::size_t i = 0, o = 0; i < image.rgba.size(); i += 4, o += 3) {
+            std::memcpy(&rgb[o], &image.rgba[i], 3);
+        }
+        pixels = rgb.data();
+    } else {
+        png.format = PNG_FORMAT_RGBA;
+    }
+    png_alloc_size_t size = 0;
+    if (!png_image_write_to_memory(&png, nullptr, &size, 0, pixels, 0, nullptr)) {
+        throw Failure(path.string() + ": cannot encode PNG (" + png.message + ")");
+    }
+    std::vector<uint8_t> encoded(size);
+    if (!png_image_write_to_memory(&png, encoded.data(), &size, 0, pixels, 0, nullptr)) {
+        throw Failure(path.string() + ": cannot encode PNG (" + png.message + ")");
+    }
+    encoded.resize(size);
+    return encoded;
+}
+
+// ---- JPEG --------------------------------------------------------------
+
+struct JpegErrors {
+    jpeg_error_mgr manager;
+    std::jmp_buf jump;
+    char message[JMSG_LENGTH_MAX];
+};
+
+[[noreturn]] void jpeg_fail(j_common_ptr info) {
+    auto* errors = reinterpret_cast<JpegErrors*>(info->err);
+    info->err->format_message(info, errors->message);
+    std::longjmp(errors->jump, 1);
+}
+
+// Warnings stay quiet, except for a file that ends before its last scan:
+// the decoder would fill the missing rows with grey and report success.
+void jpeg_warn(j_common_ptr info, int level) {
+    if (level < 0 && info->err->msg_code == JWRN_JPEG_EOF) jpeg_fail(info);
+}
+
+void install_errors(jpeg_error_mgr* manager, JpegErrors* errors) {
+    jpeg_std_error(manager);
+    manager->error_exit = jpeg_fail;
+    manager->emit_message = jpeg_warn;
+    errors->message[0] = '\0';
+}
+
+// The decoder reports errors by a long jump back into this frame, so it
+// holds no object with a destructor; the result goes to the caller's image.
+bool decode_jpeg(const std::string* file, Image* image, uint64_t* too_large, JpegErrors* errors) {
+    jpeg_decompress_struct info{};
+    info.err = &errors->manager;
+    install_errors(&errors->manager, errors);
+    if (setjmp(errors->jump)) {
+        jpeg_destroy_decompress(&info);
+        return false;
+    }
+    jpeg_create_decompress(&info);
+    jpeg_mem_src(&info, reinterpret_cast<const unsigned char*>(file->data()),
+                 static_cast<unsigned long>(file->size()));
+    jpeg_read_header(&info, TRUE);
+    if (uint64_t{info.image_width} * info.image_height > kMaxPixels) {
+        too_large[0] = info.image_width;
+        too_large[1] = info.image_height;
+        jpeg_destroy_decompress(&info);
+        return false;
+    }
+    info.out_color_space = JCS_EXT_RGBA;
+    jpeg_start_decompress(&info);
+    image->width = info.output_width;
+    image->height = info.output_height;
+    image->rgba.resize(std::size_t{4} * info.output_width * info.output_height);
+    while (info.output_scanline < info.output_height) {
+        JSAMPROW row = image->pixel(0, info.output_scanline);
+        jpeg_read_scanlines(&info, &row, 1);
+    }
+    jpeg_finish_decompress(&info);
+    jpeg_destroy_decompress(&info);
+    return true;
+}
+
+bool encode_jpeg(const Image* image, int quality, unsigned char** buffer, unsigned long* size,
+                 JpegErrors* errors) {
+    jpeg_compress_struct info{};
+    info.err = &errors->manager;
+    install_errors(&errors->manager, errors);
+    if (setjmp(errors->jump)) {
+        jpeg_destroy_compress(&info);
+        return false;
+    }
+    jpeg_create_compress(&info);
+    jpeg_mem_dest(&info, buffer, size);
+    info.image_width = image->width;
+    info.image_height = image->height;
+    info.input_components = 4;
+    info.in_color_space = JCS_EXT_RGBA;
+    jpeg_set_defaults(&info);
+    jpeg_set_quality(&info, quality, TRUE);
+    jpeg_start_compress(&info, TRUE);
+    while (info.next_scanline < info.image_height) {
+        JSAMPROW row = const_cast<uint8_t*>(image->pixel(0, info.next_scanline));
+        jpeg_write_scanlines(&info, &row, 1);
+    }
+    jpeg_finish_compress(&info);
+    jpeg_destroy_compress(&info);
+    return true;
+}
+
+// The EXIF orientation tag of a JPEG, 1 (upright) when there is none.
+int exif_orientation(const std::string& file) {
+    ExifData* exif = exif_data_new_from_data(reinterpret_cast<const unsigned char*>(file.data()),
+                                             static_cast<unsigned int>(file.size()));
+    if (exif == nullptr) return 1;
+    int orientation = 1;
+    ExifEntry* entry = exif_content_get_entry(exif->ifd[EXIF_IFD_0], EXIF_TAG_ORIENTATION);
+    if (entry != nullptr && entry->format == EXIF_FORMAT_SHORT && entry->components >= 1 &&
+        entry->data != nullptr && entry->size >= 2) {
+        orientation = exif_get_short(entry->data, exif_data_get_byte_order(exif));
+    }
+    exif_data_unref(exif);
+    return orientation;
+}
+
+Image decode_jpeg_upright(const std::string& file, const std::filesystem::path& path) {
+    Image image;
+    JpegErrors errors;
+    uint64_t too_large[2] = {0, 0};
+    if (!decode_jpeg(&file, &image, too_large, &errors)) {
+        if (too_large[0] != 0) check_size(path, too_large[0], too_large[1]);
+        throw Failure(path.string() + ": not a readable JPEG file (" + errors.message + ")");
+    }
+    check_size(path, image.width, image.height);
+    return orient_upright(image, exif_orientation(file));
+}
+
+}  // namespace
+
+Image read_image(const std::filesystem::path& path) {
+    const Format format = require_format(path);
+    const std::string file = read_file(path);
+    return format == Format::png ? decode_png(file, path) : decode_jpeg_upright(file, path);
+}
+
+void write_image(const Image& image, const std::filesystem::path& path, int quality) {
+    if (require_format(path) == Format::png) {
+        const std::vector<uint8_t> encoded = encode_png(image, path);
+        write_file(path, encoded.data(), encoded.size());
+        return;
+    }
+    JpegErrors errors;
+    unsigned char* buffer = nullptr;
+    unsigned long size = 0;
+    const bool encoded = encode_jpeg(&image, quality, &buffer, &size, &errors);
+    if (!encoded) {
+        std::free(buffer);
+        throw Failure(path.string() + ": cannot encode JPEG (" + errors.message + ")");
+    }
+    try {
+        write_file(path, buffer, size);
+    } catch (...) {
+        std::free(buffer);
+        throw;
+    }
+    std::free(buffer);
+}
+
+}  // namespace vorlite::cli
