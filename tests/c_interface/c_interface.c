@@ -25,6 +25,9 @@ int main(void) {
     memcpy(bitmap.data + 4, &color, 4);
 
     VorEffectInitParams(&options);
+    failures += check(options.seed == 0 && options.strength == 1.0 && options.bordersEnabled == 1 &&
+                          options.scale == 1.0,
+                      "default run options");
     options.seed = 7;
     document = VLPLLoadEffect(
         "{\"identifier\": \"c\", \"processors\": [{\"name\": \"original\", \"parameters\": {}}]}");

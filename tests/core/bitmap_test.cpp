@@ -96,21 +96,6 @@ TEST(Color, SetARGBTakesAlphaFirstAndStoresItLast) {
     VorColorSetARGB(&c, 255, 1, 2, 3);
     const uint8_t expected[4] = {1, 2, 3, 255};
     EXPECT_EQ(std::memcmp(&c, expected, 4), 0);
-    VorColor d{};
-    VorColorCopy(&d, &c);
-    EXPECT_EQ(std::memcmp(&c, &d, 4), 0);
-}
-
-TEST(PointScale, IsOneSinglePrecisionProductPerAxis) {
-    VorPoint p;
-    VorPointMake(&p, 0.1f, 3.0f);
-    const VorPoint s = VorPointScale(p, 3.0f, 0.5f);
-    EXPECT_EQ(s.x, 0.1f * 3.0f);
-    EXPECT_EQ(s.y, 1.5f);
-    VorSize size;
-    VorSizeMake(&size, 4.0f, 2.5f);
-    EXPECT_EQ(size.width, 4.0f);
-    EXPECT_EQ(size.height, 2.5f);
 }
 
 }  // namespace
