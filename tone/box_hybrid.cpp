@@ -121,9 +121,9 @@ public:
     Extended(const std::uint32_t* sums, std::size_t stride, std::uint32_t length)
         : sums_(sums), stride_(stride), last_(static_cast<std::int64_t>(length) - 1) {
         const std::uint32_t* last_entry = sums + (length - 1) * stride;
+        const std::uint32_t* before_last = length > 1 ? last_entry - stride : nullptr;
         for (std::size_t i = 0; i < stride; ++i) {
-            const std::uint32_t before_last = length > 1 ? last_entry[i - stride] : 0u;
-            slope_[i] = last_entry[i] - before_last;
+            slope_[i] = last_entry[i] - (before_last != nullptr ? before_last[i] : 0u);
         }
     }
 
@@ -169,8 +169,9 @@ void filter_lines(const Lines& lines, const std::uint32_t* sums, const Pass& pas
         for (std::uint32_t k = 0; k < lines.lanes; ++k) {
             std::uint32_t acc[3] = {kRounding, kRounding, kRounding};
             if (inside) {
-                const std::uint32_t* read = sums + start * static_cast<std::ptrdiff_t>(stride) + 4 * k;
-                for (std::int32_t j = 0; j < pass.taps; ++j, read += tap_stride) {
+                const std::uint32_t* first = sums + start * static_cast<std::ptrdiff_t>(stride) + 4 * k;
+                for (std::int32_t j = 0; j < pass.taps; ++j) {
+                    const std::uint32_t* read = first + j * tap_stride;
                     acc[0] += pass.diff[j] * read[0];
                     acc[1] += pass.diff[j] * read[1];
                     acc[2] += pass.diff[j] * read[2];
