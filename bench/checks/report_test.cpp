@@ -1,0 +1,156 @@
+#include <gtest/gtest.h>
+
+#include <initializer_list>
+#include <sstream>
+#include <string>
+#include <vector>
+
+#include "report.h"
+
+namespace {
+
+namespace report = vorlite::bench::report;
+
+struct Entry {
+    std::string run_name;
+    std::string aggregate;  // "median", "mean", or "" for a single iteration run
+    double cpu;
+    double real;
+    std::string unit;
+    double pixels;
+    std::string label;
+    bool error = false;
+};
+
+std::string json(const std::vector<Entry>& entries) {
+    std::ostringstream out;
+    out << R"({"context": {"date": "today", "num_cpus": 2, "photo": "coffee.png", "opencv": "4.6.0, threads 1",)"
+        << R"( "document": "bench/five.json"}, "benchmarks": [)";
+    for (size_t i = 0; i < entries.size(); ++i) {
+        const Entry& e = entries[i];
+        out << (i ? "," : "") << R"({"name": ")" << e.run_name << "_" << e.aggregate << R"(", "run_name": ")"
+            << e.run_name << R"(", "run_type": ")" << (e.aggregate.empty() ? "iteration" : "aggregate")
+            << R"(", "repetitions": 5, "aggregate_name": ")" << e.aggregate << R"(", "real_time": )" << e.real
+            << R"(, "cpu_time": )" << e.cpu << R"(, "time_unit": ")" << e.unit << R"(", "pixels": )" << e.pixels
+            << R"(, "label": ")" << e.label << "\"" << (e.error ? R"(, "error_occurred": true)" : "") << "}";
+    }
+    out << "]}";
+    return out.str();
+}
+
+report::Run parsed(const std::vector<Entry>& entries) {
+    report::Run run;
+    std::string error;
+    EXPECT_TRUE(report::read_run(json(entries), run, error)) << error;
+    return run;
+}
+
+// The first line of text that holds every one of parts.
+std::string line_with(const std::string& text, std::initializer_list<std::string> parts) {
+    std::istringstream lines(text);
+    for (std::string line; std::getline(lines, line);) {
+        bool all = true;
+        for (const std::string& part : parts) all = all && line.find(part) != std::string::npos;
+        if (all) return line;
+    }
+    return "";
+}
+
+TEST(BenchReport, ReadsMediansPerPixelInAnyTimeUnit) {
+    const report::Run run = parsed({
+        {"lut/ours/12MP/min_time:0.300/real_time", "median", 24.0, 30.0, "ms", 12e6, "ours"},
+        {"lut/ours/12MP/min_time:0.300/real_time", "mean", 99.0, 99.0, "ms", 12e6, "ours"},
+        {"lut/ours/12MP/min_time:0.300/real_time", "", 98.0, 98.0, "ms", 12e6, "ours"},
+        {"lut/opencv/1MP/min_time:0.200/real_time", "median", 1500.0, 3000.0, "us", 1e6, "peer"},
+        {"lut/vips/1MP/min_time:0.200/real_time", "median", 1.0, 1.0, "ms", 1e6, "failed", true},
+    });
+    ASSERT_EQ(run.medians.size(), 2u);
+    const report::Median& ours = run.medians.at("lut/ours/12MP");
+    EXPECT_DOUBLE_EQ(ours.cpu_ns_per_pixel, 2.0);
+    EXPECT_DOUBLE_EQ(ours.wall_ns_per_pixel, 2.5);
+    EXPECT_EQ(ours.label, "ours");
+    EXPECT_DOUBLE_EQ(run.medians.at("lut/opencv/1MP").cpu_ns_per_pixel, 1.5);
+    EXPECT_EQ(run.repetitions, 5);
+    EXPECT_EQ(run.context.at("photo"), "coffee.png");
+    EXPECT_EQ(run.context.count("num_cpus"), 0u);
+}
+
+TEST(BenchReport, RejectsTextThatIsNotABenchmarkReport) {
+    report::Run run;
+    std::string error;
+    EXPECT_FALSE(report::read_run(R"({"benchmarks": []})", run, error));
+    EXPECT_FALSE(report::read_run("not json", run, error));
+    EXPECT_FALSE(error.empty());
+}
+
+TEST(BenchReport, JudgesEachGoalByTheRatioOfCpuMedians) {
+    report::Inputs inputs;
+    inputs.single = parsed({
+        {"lut/ours/12MP", "median", 12.0, 50.0, "ms", 12e6, "ours"},
+        {"lut/opencv/12MP", "median", 30.0, 30.0, "ms", 12e6, "peer"},
+        {"lut/memcpy/12MP", "median", 3.0, 3.0, "ms", 12e6, "floor"},
+    });
+    inputs.multi = parsed({{"lut/opencv/12MP", "median", 30.0, 8.4, "ms", 12e6, "peer"}});
+    const std::string text = report::render(inputs);
+
+    const std::string opencv = line_with(text, {"cv::LUT", "12MP"});
+    EXPECT_NE(opencv.find("| 0.40 | <= 0.50 | yes | 0.70 |"), std::string::npos) << opencv;
+    const std::string floor = line_with(text, {"memcpy", "12MP"});
+    EXPECT_NE(floor.find("| 4.00 | <= 3.00 | **no** |"), std::string::npos) << floor;
+    const std::string vips = line_with(text, {"vips_maplut", "12MP"});
+    EXPECT_NE(vips.find("| n/a | - | - | n/a |"), std::string::npos) << vips;
+    const std::string unmeasured = line_with(text, {"cv::transform", "12MP"});
+    EXPECT_NE(unmeasured.find("| n/a | <= 0.60 | n/a |"), std::string::npos) << unmeasured;
+}
+
+TEST(BenchReport, FlagsGrowthWithSizeAndWithAmount) {
+    report::Inputs inputs;
+    inputs.single = parsed({
+        {"clarity/ours/1MP", "median", 2.0, 2.0, "ms", 1e6, "VorEnhanceClarity"},
+        {"clarity/ours/12MP", "median", 36.0, 36.0, "ms", 12e6, "VorEnhanceClarity"},
+        {"noise/ours/1MP", "median", 2.0, 2.0, "ms", 1e6, "grain"},
+        {"noise/ours/12MP", "median", 30.0, 30.0, "ms", 12e6, "grain"},
+        {"sharpen_a50/ours/12MP", "median", 100.0, 100.0, "ms", 12e6, "amount 50"},
+        {"sharpen_a400/ours/12MP", "median", 120.0, 120.0, "ms", 12e6, "amount 400"},
+    });
+    const std::string text = report::render(inputs);
+
+    EXPECT_NE(line_with(text, {"VorEnhanceClarity: per pixel"}).find("| 1.50 | <= 1.30 | **no** |"),
+              std::string::npos);
+    EXPECT_NE(line_with(text, {"grain: per pixel"}).find("| 1.25 | <= 1.30 | yes |"), std::string::npos);
+    EXPECT_NE(line_with(text, {"amount 400 over amount 50"}).find("| 1.20 | <= 1.50 | yes |"), std::string::npos);
+    // Clarity has no peer; the sharpening amounts belong to the growth check.
+    EXPECT_NE(line_with(text, {"| VorEnhanceClarity |"}).find("| 2.00 | 3.00 | 36.0 |"), std::string::npos);
+    EXPECT_EQ(line_with(text, {"| amount 400 |"}), "");
+}
+
+TEST(BenchReport, ListsTheDocumentStepsBeforeTheirTotal) {
+    report::Inputs inputs;
+    inputs.single = parsed({
+        {"doc_total/ours/12MP", "median", 60.0, 60.0, "ms", 12e6, "all five"},
+        {"doc_p2_noise/ours/12MP", "median", 24.0, 24.0, "ms", 12e6, "processor 2"},
+        {"doc_p1_contrast/ours/12MP", "median", 12.0, 12.0, "ms", 12e6, "processor 1"},
+    });
+    const std::string text = report::render(inputs);
+    const size_t first = text.find("| processor 1 |");
+    const size_t second = text.find("| processor 2 |");
+    const size_t total = text.find("| all five |");
+    ASSERT_NE(total, std::string::npos);
+    EXPECT_LT(first, second);
+    EXPECT_LT(second, total);
+    EXPECT_NE(text.find("bench/five.json"), std::string::npos);
+}
+
+TEST(BenchReport, GivesTheMemoryRatioOrWhyItIsMissing) {
+    report::Inputs inputs;
+    inputs.single = parsed({});
+    inputs.memory.note = "the tool is not built";
+    EXPECT_NE(report::render(inputs).find("Not measured: the tool is not built."), std::string::npos);
+
+    inputs.memory = {true, 151e6, 48e6, ""};
+    EXPECT_NE(line_with(report::render(inputs), {"| ratio"}).find("3.15 (**no**)"), std::string::npos);
+    inputs.memory.peak_bytes = 100e6;
+    EXPECT_NE(line_with(report::render(inputs), {"| ratio"}).find("2.08 (yes)"), std::string::npos);
+}
+
+}  // namespace

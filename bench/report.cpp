@@ -1,0 +1,297 @@
+#include "report.h"
+
+#include <cstdio>
+#include <memory>
+#include <set>
+#include <sstream>
+#include <vector>
+#include <yajl/yajl_tree.h>
+
+#include "catalogue.h"
+
+namespace vorlite::bench::report {
+
+namespace {
+
+using Tree = std::unique_ptr<std::remove_pointer_t<yajl_val>, decltype(&yajl_tree_free)>;
+
+yajl_val field(yajl_val object, const char* key, yajl_type type) {
+    const char* path[] = {key, nullptr};
+    return yajl_tree_get(object, path, type);
+}
+
+std::string string_field(yajl_val object, const char* key) {
+    const yajl_val value = field(object, key, yajl_t_string);
+    return value != nullptr ? YAJL_GET_STRING(value) : "";
+}
+
+bool number_field(yajl_val object, const char* key, double& out) {
+    const yajl_val value = field(object, key, yajl_t_number);
+    if (value == nullptr) return false;
+    out = YAJL_GET_DOUBLE(value);
+    return true;
+}
+
+double nanoseconds_per(const std::string& unit) {
+    if (unit == "ns") return 1.0;
+    if (unit == "us") return 1e3;
+    if (unit == "ms") return 1e6;
+    if (unit == "s") return 1e9;
+    return 0.0;
+}
+
+// "lut/ours/12MP/min_time:0.300/real_time" -> "lut/ours/12MP".
+std::string key_of(const std::string& run_name) {
+    size_t end = 0;
+    for (int parts = 0; parts < 3; ++parts) {
+        end = run_name.find('/', end);
+        if (end == std::string::npos) return parts == 2 ? run_name : "";
+        ++end;
+    }
+    return run_name.substr(0, end - 1);
+}
+
+std::string key(const std::string& operation, const std::string& side, const BitmapSize& size) {
+    return operation + "/" + side + "/" + size.label;
+}
+
+const Median* find(const Run& run, const std::string& k) {
+    const auto it = run.medians.find(k);
+    return it == run.medians.end() ? nullptr : &it->second;
+}
+
+std::string fixed(double value, int decimals) {
+    char text[64];
+    std::snprintf(text, sizeof text, "%.*f", decimals, value);
+    return text;
+}
+
+std::string per_pixel(const Median* m) { return m != nullptr ? fixed(m->cpu_ns_per_pixel, 2) : "n/a"; }
+
+std::string wall_per_pixel(const Median* m) { return m != nullptr ? fixed(m->wall_ns_per_pixel, 2) : "n/a"; }
+
+// Milliseconds per call on the large bitmap, by CPU time.
+std::string large_ms(const Median* m) {
+    return m != nullptr ? fixed(m->cpu_ns_per_pixel * m->pixels * 1e-6, 1) : "n/a";
+}
+
+// a / b by CPU time, when both were measured.
+bool cpu_ratio(const Median* a, const Median* b, double& ratio) {
+    if (a == nullptr || b == nullptr || b->cpu_ns_per_pixel <= 0.0) return false;
+    ratio = a->cpu_ns_per_pixel / b->cpu_ns_per_pixel;
+    return true;
+}
+
+std::string met(bool ok) { return ok ? "yes" : "**no**"; }
+
+std::string context_entry(const Run& run, const char* name) {
+    const auto it = run.context.find(name);
+    return it == run.context.end() ? "" : it->second;
+}
+
+bool is_document(const std::string& operation) { return operation.rfind("doc_", 0) == 0; }
+
+// The library's operations, each once, in name order.
+std::vector<std::string> our_operations(const Run& run) {
+    std::vector<std::string> operations;
+    std::set<std::string> seen;
+    for (const auto& [k, median] : run.medians) {
+        const size_t first = k.find('/');
+        const size_t second = k.find('/', first + 1);
+        if (k.substr(first + 1, second - first - 1) != kOurs) continue;
+        const std::string operation = k.substr(0, first);
+        if (seen.insert(operation).second) operations.push_back(operation);
+    }
+    return operations;
+}
+
+bool in_pairs(const std::string& operation) {
+    for (const Comparison& row : kComparisons) {
+        if (operation == row.operation) return true;
+    }
+    return operation == kSharpenSmallAmount || operation == kSharpenLargeAmount;
+}
+
+void heading(std::ostringstream& out, const Inputs& in) {
+    const Run& run = in.single;
+    out << "# Benchmark results\n\n";
+    out << "Measured " << in.date << " on " << in.machine << ".\n\n";
+    out << "Medians of " << run.repetitions << " repetitions, in nanoseconds per pixel. Figures on one thread "
+        << "are the process's CPU time, which other programs sharing the machine disturb least; the last "
+        << "column is wall-clock time. Every operation works on the sample photo (`" << context_entry(run, "photo") << "`) scaled to "
+        << kLarge.width << " x " << kLarge.height << " (" << kLarge.label << ") and " << kSmall.width << " x "
+        << kSmall.height << " (" << kSmall.label << "), RGBA; the library's calls work in place on a fresh "
+        << "copy each time (the copy is not timed). The peers run on one thread (OpenCV "
+        << context_entry(run, "opencv") << "; libvips " << context_entry(run, "libvips")
+        << "), as the library owns none; the last column repeats them on every core (OpenCV "
+        << context_entry(in.multi, "opencv") << "; libvips " << context_entry(in.multi, "libvips")
+        << ") for information. Ratios compare medians of the same run.\n\n";
+}
+
+void pairs_table(std::ostringstream& out, const Inputs& in) {
+    out << "## The library against its peers\n\n";
+    out << "| operation | peer | size | ours | peer | ours / peer | goal | met | peer, every core |\n";
+    out << "|---|---|---|---:|---:|---:|---:|---|---:|\n";
+    for (const Comparison& row : kComparisons) {
+        for (const BitmapSize& size : kSizes) {
+            const Median* ours = find(in.single, key(row.operation, kOurs, size));
+            const Median* peer = find(in.single, key(row.operation, row.peer, size));
+            const Median* multi = find(in.multi, key(row.operation, row.peer, size));
+            std::string ratio = "n/a";
+            std::string goal = row.goal > 0.0 ? "<= " + fixed(row.goal, 2) : "-";
+            std::string verdict = row.goal > 0.0 ? "n/a" : "-";
+            double r = 0.0;
+            if (cpu_ratio(ours, peer, r)) {
+                ratio = fixed(r, 2);
+                if (row.goal > 0.0) verdict = met(r <= row.goal);
+            }
+            out << "| " << row.ours_label << " | " << row.peer_label << " | " << size.label << " | "
+                << per_pixel(ours) << " | " << per_pixel(peer) << " | " << ratio << " | " << goal << " | "
+                << verdict << " | " << wall_per_pixel(multi) << " |\n";
+        }
+    }
+    out << "\n";
+}
+
+void growth_table(std::ostringstream& out, const Inputs& in) {
+    out << "## Growth\n\n";
+    out << "| check | value | goal | met |\n|---|---:|---:|---|\n";
+    const Median* small_amount = find(in.single, key(kSharpenSmallAmount, kOurs, kLarge));
+    const Median* large_amount = find(in.single, key(kSharpenLargeAmount, kOurs, kLarge));
+    out << "| sharpening, amount 400 over amount 50, " << kLarge.label << " | ";
+    double r = 0.0;
+    if (cpu_ratio(large_amount, small_amount, r)) {
+        out << fixed(r, 2) << " | <= " << fixed(kSharpenGrowthGoal, 2) << " | " << met(r <= kSharpenGrowthGoal);
+    } else {
+        out << "n/a | <= " << fixed(kSharpenGrowthGoal, 2) << " | n/a";
+    }
+    out << " |\n";
+    // Copying the same bytes grows too once the small bitmap fits in the
+    // cache and the large one does not: the floor for memory-bound passes.
+    if (cpu_ratio(find(in.single, key("lut", "memcpy", kLarge)), find(in.single, key("lut", "memcpy", kSmall)), r)) {
+        out << "| for reference, memcpy of the same bytes: per pixel, " << kLarge.label << " over " << kSmall.label
+            << " | " << fixed(r, 2) << " | - | - |\n";
+    }
+    for (const std::string& operation : our_operations(in.single)) {
+        const Median* small = find(in.single, key(operation, kOurs, kSmall));
+        const Median* large = find(in.single, key(operation, kOurs, kLarge));
+        if (!cpu_ratio(large, small, r)) continue;
+        out << "| " << large->label << ": per pixel, " << kLarge.label << " over " << kSmall.label << " | "
+            << fixed(r, 2) << " | <= " << fixed(kSizeGrowthGoal, 2) << " | " << met(r <= kSizeGrowthGoal) << " |\n";
+    }
+    out << "\n";
+}
+
+void solo_table(std::ostringstream& out, const Inputs& in) {
+    out << "## Without a peer\n\n";
+    out << "| operation | " << kSmall.label << " ns/px | " << kLarge.label << " ns/px | " << kLarge.label
+        << " ms |\n|---|---:|---:|---:|\n";
+    for (const std::string& operation : our_operations(in.single)) {
+        if (in_pairs(operation) || is_document(operation)) continue;
+        const Median* small = find(in.single, key(operation, kOurs, kSmall));
+        const Median* large = find(in.single, key(operation, kOurs, kLarge));
+        const std::string& label = large != nullptr ? large->label : small->label;
+        out << "| " << label << " | " << per_pixel(small) << " | " << per_pixel(large) << " | "
+            << large_ms(large) << " |\n";
+    }
+    out << "\n";
+}
+
+void document_table(std::ostringstream& out, const Inputs& in) {
+    const std::string name = context_entry(in.single, "document");
+    out << "## Effect document\n\n";
+    if (name.empty()) {
+        out << "No effect document with five processors was measured.\n\n";
+        return;
+    }
+    out << "`" << name << "`, run with seed 7 and strength 1; each processor timed on the output of the ones "
+        << "before it.\n\n";
+    out << "| step | " << kSmall.label << " ns/px | " << kLarge.label << " ns/px | " << kLarge.label
+        << " ms |\n|---|---:|---:|---:|\n";
+    std::vector<std::string> steps;
+    for (const std::string& operation : our_operations(in.single)) {
+        if (is_document(operation) && operation != "doc_total") steps.push_back(operation);
+    }
+    steps.push_back("doc_total");
+    for (const std::string& operation : steps) {
+        const Median* small = find(in.single, key(operation, kOurs, kSmall));
+        const Median* large = find(in.single, key(operation, kOurs, kLarge));
+        const Median* any = large != nullptr ? large : small;
+        if (any == nullptr) continue;
+        out << "| " << any->label << " | " << per_pixel(small) << " | " << per_pixel(large) << " | "
+            << large_ms(large) << " |\n";
+    }
+    out << "\n";
+}
+
+void memory_section(std::ostringstream& out, const Inputs& in) {
+    out << "## Memory\n\n";
+    const Memory& memory = in.memory;
+    if (!memory.measured || memory.bitmap_bytes <= 0.0) {
+        out << "Not measured: " << (memory.note.empty() ? "no figure was given" : memory.note) << ".\n";
+        return;
+    }
+    const double r = memory.peak_bytes / memory.bitmap_bytes;
+    out << "| measure | value |\n|---|---:|\n";
+    out << "| peak resident memory | " << fixed(memory.peak_bytes / 1e6, 1) << " MB |\n";
+    out << "| decoded bitmap | " << fixed(memory.bitmap_bytes / 1e6, 1) << " MB |\n";
+    out << "| ratio (goal <= " << fixed(kMemoryGoal, 1) << ") | " << fixed(r, 2) << " (" << met(r <= kMemoryGoal)
+        << ") |\n";
+    if (!memory.note.empty()) out << "\n" << memory.note << ".\n";
+}
+
+}  // namespace
+
+bool read_run(const std::string& json, Run& run, std::string& error) {
+    char message[256] = {};
+    Tree tree(yajl_tree_parse(json.c_str(), message, sizeof message), &yajl_tree_free);
+    if (!tree) {
+        error = std::string("not JSON: ") + message;
+        return false;
+    }
+    const yajl_val benchmarks = field(tree.get(), "benchmarks", yajl_t_array);
+    const yajl_val context = field(tree.get(), "context", yajl_t_object);
+    if (benchmarks == nullptr || context == nullptr) {
+        error = "no \"context\" object and \"benchmarks\" array: not a benchmark report";
+        return false;
+    }
+    for (size_t i = 0; i < context->u.object.len; ++i) {
+        const yajl_val value = context->u.object.values[i];
+        if (YAJL_IS_STRING(value)) run.context[context->u.object.keys[i]] = YAJL_GET_STRING(value);
+    }
+    for (size_t i = 0; i < benchmarks->u.array.len; ++i) {
+        const yajl_val entry = benchmarks->u.array.values[i];
+        if (string_field(entry, "run_type") != "aggregate" || string_field(entry, "aggregate_name") != "median") {
+            continue;
+        }
+        if (field(entry, "error_occurred", yajl_t_true) != nullptr) continue;
+        const std::string k = key_of(string_field(entry, "run_name"));
+        const double scale = nanoseconds_per(string_field(entry, "time_unit"));
+        double cpu_time = 0.0;
+        double real_time = 0.0;
+        double pixels = 0.0;
+        double repetitions = 0.0;
+        if (k.empty() || scale == 0.0 || !number_field(entry, "cpu_time", cpu_time) ||
+            !number_field(entry, "real_time", real_time) || !number_field(entry, "pixels", pixels) ||
+            pixels <= 0.0) {
+            continue;
+        }
+        if (number_field(entry, "repetitions", repetitions)) run.repetitions = static_cast<int>(repetitions);
+        run.medians[k] = Median{cpu_time * scale / pixels, real_time * scale / pixels, pixels,
+                                string_field(entry, "label")};
+    }
+    return true;
+}
+
+std::string render(const Inputs& inputs) {
+    std::ostringstream out;
+    heading(out, inputs);
+    pairs_table(out, inputs);
+    growth_table(out, inputs);
+    solo_table(out, inputs);
+    document_table(out, inputs);
+    memory_section(out, inputs);
+    return out.str();
+}
+
+}  // namespace vorlite::bench::report

@@ -1,0 +1,24 @@
+// The benchmarks of the suite, registered by main once the photo is known.
+#ifndef VORLITE_BENCH_SUITE_H
+#define VORLITE_BENCH_SUITE_H
+
+#include <string>
+#include <vector>
+
+namespace vorlite::bench {
+
+// The library against its peers, at both sizes, and the sharpening amounts.
+void add_pairs();
+
+// The library's operations that have no peer, at both sizes.
+void add_solo();
+
+// Picks the first of the candidate effect documents that has exactly five
+// processors and runs on a small bitmap, and registers each processor and
+// the whole document at both sizes. Returns the chosen path, or an empty
+// string (and registers nothing) when no candidate qualifies.
+std::string add_document(const std::vector<std::string>& candidates);
+
+}  // namespace vorlite::bench
+
+#endif

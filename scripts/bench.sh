@@ -1,0 +1,94 @@
+#!/usr/bin/env bash
+# Measures the library against OpenCV and libvips on a scaled-up sample
+# photo and rewrites bench/RESULTS.md. Installs the peers from Debian when
+# missing (idempotent), builds, runs the harness's own checks,
+# then the benchmarks: every pair with the peers on one thread, the peers
+# again on every core, and the command-line tool's peak memory.
+#   BENCH_REPETITIONS=N   repetitions per benchmark (default 5)
+#   BENCH_FILTER=REGEX    only the benchmarks whose name matches (quick looks)
+#   BENCH_BUILD=DIR       build directory (default build/bench)
+set -euo pipefail
+cd "$(dirname "$0")/.."
+root=$PWD
+build=${BENCH_BUILD:-$root/build/bench}
+repetitions=${BENCH_REPETITIONS:-5}
+filter=${BENCH_FILTER:-.}
+
+as_root() {
+  if [ "$(id -u)" -eq 0 ]; then "$@"; else sudo "$@"; fi
+}
+
+"$root/scripts/setup.sh" --photos
+
+# The peers and GNU time. Another engineer may be installing at the same
+# moment: wait for dpkg's lock rather than fail.
+peers=(libopencv-dev libvips-dev time)
+need=()
+for p in "${peers[@]}"; do
+  dpkg-query -W -f='${Status}' "$p" 2>/dev/null | grep -q 'install ok installed' || need+=("$p")
+done
+if [ ${#need[@]} -gt 0 ]; then
+  echo "bench: installing: ${need[*]}"
+  as_root apt-get -o DPkg::Lock::Timeout=300 update -qq >/dev/null 2>&1 || true
+  as_root env DEBIAN_FRONTEND=noninteractive apt-get -o DPkg::Lock::Timeout=300 install -y -qq \
+    --no-install-recommends "${need[@]}" >/dev/null
+fi
+
+photo=$root/build/photos/coffee.png
+[ -f "$photo" ] || { echo "bench: error: no sample photo at $photo" >&2; exit 1; }
+
+cmake -S "$root" -B "$build" -DCMAKE_BUILD_TYPE=Release -DVORLITE_BUILD_BENCH=ON >/dev/null
+targets=(vorlite_bench vorlite_bench_report vorlite_bench_tests)
+have_tool=0
+# The command-line tool is measured when this tree has it.
+known_targets=$(cmake --build "$build" --target help)
+if grep -qE '^\.\.\. vorlite( |$)' <<<"$known_targets"; then
+  targets+=(vorlite)
+  have_tool=1
+fi
+cmake --build "$build" -j"$(nproc 2>/dev/null || echo 2)" --target "${targets[@]}" >/dev/null
+
+echo "bench: checking that each peer does the same work as the library"
+"$build/bench/vorlite_bench_tests" --gtest_brief=1
+
+documents=()
+for d in "$root"/examples/effects/*.json "$root"/bench/five-step-look.json; do
+  [ -f "$d" ] && documents+=("--document=${d#"$root"/}")
+done
+common=(--photo="${photo#"$root"/}" --benchmark_repetitions="$repetitions"
+  --benchmark_report_aggregates_only=true --benchmark_out_format=json)
+
+echo "bench: the library and its peers, peers on one thread"
+"$build/bench/vorlite_bench" "${common[@]}" "${documents[@]}" --benchmark_filter="$filter" \
+  --benchmark_out="$build/single.json"
+echo "bench: the peers on every core"
+# The library runs on one thread whatever the setting: only the peers again.
+peer_filter=$filter
+[ "$filter" = . ] && peer_filter='/(opencv|vips)/'
+"$build/bench/vorlite_bench" "${common[@]}" --peer-threads=all \
+  --benchmark_filter="$peer_filter" --benchmark_out="$build/multi.json"
+
+memory=()
+if [ "$have_tool" -eq 1 ]; then
+  echo "bench: the command-line tool's peak memory on a 12-megapixel photo"
+  large=$build/photo-12mp.png
+  "$build/bench/vorlite_bench" --photo="$photo" --write-photo="$large"
+  document=$(sed -n 's/^ *"document": "\(.*\)",\{0,1\}$/\1/p' "$build/single.json" | head -n 1)
+  [ -n "$document" ] || document=bench/five-step-look.json
+  /usr/bin/time -v "$build/cli/vorlite" apply "$root/$document" "$large" "$build/photo-12mp-out.png" \
+    2>"$build/time.txt" >/dev/null
+  peak=$(sed -n 's/.*Maximum resident set size (kbytes): *\([0-9]*\).*/\1/p' "$build/time.txt")
+  memory=(--peak-rss-kb="$peak" --bitmap-bytes=$((4000 * 3000 * 4))
+    --memory-note="vorlite apply $document on the sample photo scaled to 4000 x 3000 (PNG), peak resident set size from /usr/bin/time -v")
+else
+  memory=(--memory-note="the command-line tool vorlite is not built in this tree")
+fi
+
+model=$(sed -n 's/^model name[[:space:]]*: //p' /proc/cpuinfo | head -n 1)
+mem_gib=$(awk '/^MemTotal/ { printf "%.0f", $2 / 1048576 }' /proc/meminfo)
+compiler=$(c++ --version | head -n 1)
+machine="$model, $(nproc) cores, $mem_gib GiB, Linux $(uname -r), $compiler, other programs running: load average $(cut -d' ' -f1-3 /proc/loadavg)"
+"$build/bench/vorlite_bench_report" --single="$build/single.json" --multi="$build/multi.json" \
+  --machine="$machine" --date="$(date -u '+%Y-%m-%d %H:%M UTC')" "${memory[@]}" --out="$root/bench/RESULTS.md"
+echo "bench: wrote bench/RESULTS.md"
+cat "$root/bench/RESULTS.md"
