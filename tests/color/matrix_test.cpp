@@ -12,16 +12,16 @@
 
 namespace {
 
-// Every level 0..255 in each channel (rotated per channel), alpha 42.
-std::vector<uint8_t> ramp_pixels() {
-    std::vector<uint8_t> bytes(256 * 4);
-    for (int v = 0; v < 256; ++v) {
-        bytes[v * 4 + 0] = static_cast<uint8_t>(v);
-        bytes[v * 4 + 1] = static_cast<uint8_t>(v * 7 + 3);
-        bytes[v * 4 + 2] = static_cast<uint8_t>(255 - v);
-        bytes[v * 4 + 3] = 42;
-    }
-    return bytes;
+// Every level 0..255 in each channel (rotated per channel), alpha 42, optionally
+// transformed by m or blended back over the original.
+std::vector<uint8_t> ramp(const VorColorMatrix* m = nullptr, bool blended = false, uint32_t mode = 0,
+                          float opacity = 1.0f) {
+    std::vector<uint8_t> b(256 * 4);
+    for (int v = 0; v < 256; ++v) b[v * 4] = v, b[v * 4 + 1] = v * 7 + 3, b[v * 4 + 2] = 255 - v, b[v * 4 + 3] = 42;
+    VorBitmap bitmap{b.data(), 256, 1};
+    if (m && blended) VorBitmapColorMatrixTransformAndBlendWithOriginal(&bitmap, m, mode, opacity);
+    if (m && !blended) VorBitmapColorMatrixTransform(&bitmap, m);
+    return b;
 }
 
 VorColor transform_colour(const VorColorMatrix& m, VorColor c) {
@@ -30,35 +30,27 @@ VorColor transform_colour(const VorColorMatrix& m, VorColor c) {
     return c;
 }
 
-TEST(ColorMatrix, WorkedColours) {
-    VorColorMatrix grey = VorColorMatrixIdentity, flat = VorColorMatrixIdentity;
+// The newest builder acts on the colour first; M x M may share a record.
+TEST(ColorMatrix, WorkedColoursAndRightComposition) {
+    VorColorMatrix grey = VorColorMatrixIdentity, flat = VorColorMatrixIdentity, m = VorColorMatrixIdentity;
     VorColorMatrixAdjSaturation(&grey, 0.0f);
     VorColorMatrixBrightnessContrast(&flat, 1.0f, 0.0f);
-    const VorColor red = transform_colour(grey, VorColor{255, 0, 0, 42});
-    const VorColor mid = transform_colour(flat, VorColor{3, 250, 77, 9});
-    EXPECT_EQ((std::vector<int>{red.r, red.g, red.b, red.a}), (std::vector<int>{54, 54, 54, 42}));  // 54.315
-    EXPECT_EQ((std::vector<int>{mid.r, mid.g, mid.b, mid.a}), (std::vector<int>{128, 128, 128, 9}));
-    VorColorMatrix m = grey;
-    VorColorMatrixContrast(&m, 0.0f);
-    EXPECT_EQ(std::memcmp(&m, &grey, sizeof m), 0);
-}
-
-// The newest builder acts on the colour first; M x M may share a record.
-TEST(ColorMatrix, BuildersComposeOnTheRight) {
-    VorColorMatrix m = VorColorMatrixIdentity;
+    const VorColor red = transform_colour(grey, {255, 0, 0, 42}), mid = transform_colour(flat, {3, 250, 77, 9});
+    EXPECT_TRUE(red.r == 54 && red.g == 54 && red.b == 54 && red.a == 42);
+    EXPECT_TRUE(mid.r == 128 && mid.g == 128 && mid.b == 128 && mid.a == 9);
+    VorColorMatrix unchanged = grey;
+    VorColorMatrixContrast(&unchanged, 0.0f);
+    EXPECT_EQ(std::memcmp(&unchanged, &grey, sizeof grey), 0);
     VorColorMatrixBrightness(&m, 2.0f);
     VorColorMatrixContrast(&m, 1.0f);  // x -> 2x - 128, then doubled
-    EXPECT_EQ(transform_colour(m, VorColor{100, 64, 70, 0}).r, 144);
-    VorColorMatrix c = VorColorMatrixIdentity;
-    VorColorMatrixContrast(&c, 1.0f);
-    VorColorMatrixMultiply(&c, &c);  // 2(2x - 128) - 128
-    EXPECT_EQ(c.m[0], 4.0f);
-    EXPECT_EQ(c.m[11], -384.0f);
+    EXPECT_EQ(transform_colour(m, {100, 64, 70, 0}).r, 144);
+    VorColorMatrixMultiply(&m, &m);  // (4x - 256) applied twice
+    EXPECT_TRUE(m.m[0] == 16.0f && m.m[5] == 16.0f && m.m[11] == -1280.0f);
 }
 
-// Both the table path and the per-pixel path round half up and clamp.
-TEST(ColorMatrix, RoundingBoundaries) {
-    const float cases[][2] = {{254.6f, 255}, {254.5f, 255}, {-0.6f, 0}, {-0.5f, 0}, {127.5f, 128}, {127.49f, 127}};
+// Both the table path and the per-pixel path round half up and clamp, and they agree on diagonal matrices.
+TEST(ColorMatrix, FastAndGeneralPathsRoundHalfUpAndAgree) {
+    const float cases[][2] = {{254.5f, 255}, {-0.5f, 0}, {127.5f, 128}, {127.49f, 127}};
     for (const auto& c : cases) {
         for (bool cross : {false, true}) {
             VorColorMatrix m = VorColorMatrixIdentity;
@@ -67,45 +59,22 @@ TEST(ColorMatrix, RoundingBoundaries) {
             EXPECT_EQ(transform_colour(m, VorColor{0, 0, 0, 5}).r, c[1]) << c[0] << " cross " << cross;
         }
     }
-}
-
-TEST(ColorMatrix, DiagonalFastPathEqualsPerPixelPath) {
-    // (red gain, red offset, green gain, green offset, blue gain, blue offset)
-    const float diagonals[][6] = {{0.5f, 0.25f, 1.7f, -30.5f, 2.0f, -128.0f},
-                                  {-1.0f, 255.0f, 0.1f, 99.9f, 3.3f, 0.5f},
-                                  {1.0039216f, -0.5f, 0.999f, 0.5f, 4.0f, -255.5f}};
-    for (const auto& g : diagonals) {
-        const VorColorMatrix m = {{g[0], 0, 0, g[1], 0, g[2], 0, g[3], 0, 0, g[4], g[5]}};
-        std::vector<uint8_t> fast = ramp_pixels(), general = fast;
-        VorBitmap a{fast.data(), 16, 16}, b{general.data(), 16, 16};
-        VorBitmapColorMatrixTransform(&a, &m);
-        vorlite::color::color_matrix_per_pixel(&b, m);
-        EXPECT_EQ(fast, general) << g[0] << " " << g[1];
+    for (const VorColorMatrix& m : {VorColorMatrix{{0.5f, 0, 0, 0.25f, 0, 1.7f, 0, -30.5f, 0, 0, 2.0f, -128.0f}},
+                                    VorColorMatrix{{-1.0f, 0, 0, 255.0f, 0, 0.1f, 0, 99.9f, 0, 0, 3.3f, 0.5f}}}) {
+        std::vector<uint8_t> general = ramp();
+        VorBitmap bitmap{general.data(), 256, 1};
+        vorlite::color::color_matrix_per_pixel(&bitmap, m);
+        EXPECT_EQ(ramp(&m), general) << m.m[0];
     }
-}
-
-// Pixels transformed by m, optionally through the blend with the original.
-std::vector<uint8_t> with_matrix(const VorColorMatrix& m, bool blended = false, uint32_t mode = 0,
-                                 float opacity = 1.0f) {
-    std::vector<uint8_t> bytes = ramp_pixels();
-    VorBitmap bitmap{bytes.data(), 256, 1};
-    if (blended) {
-        VorBitmapColorMatrixTransformAndBlendWithOriginal(&bitmap, &m, mode, opacity);
-    } else {
-        VorBitmapColorMatrixTransform(&bitmap, &m);
-    }
-    return bytes;
 }
 
 TEST(ColorMatrix, BlendWithOriginal) {
     const VorColorMatrix swap = {{0, 1, 0, 0, 1, 0, 0, 0, 0, 0, 1, 0}};  // red and green exchanged
-    EXPECT_EQ(with_matrix(swap, true, VOR_BLEND_NORMAL, 0.0f), ramp_pixels());
-    EXPECT_EQ(with_matrix(swap, true, VOR_BLEND_NORMAL, 1.0f), with_matrix(swap));
+    EXPECT_EQ(ramp(&swap, true, VOR_BLEND_NORMAL, 0.0f), ramp());
+    EXPECT_EQ(ramp(&swap, true, VOR_BLEND_NORMAL, 1.0f), ramp(&swap));
     // Without cross terms the matrix takes full effect whatever the opacity.
-    VorColorMatrix brighter;
-    VorColorMatrixSetIdentity(&brighter);
-    VorColorMatrixBrightness(&brighter, 1.5f);
-    EXPECT_EQ(with_matrix(brighter, true, VOR_BLEND_MULTIPLY, 0.0f), with_matrix(brighter));
+    const VorColorMatrix brighter = {{1.5f, 0, 0, 0, 0, 1.5f, 0, 0, 0, 0, 1.5f, 0}};
+    EXPECT_EQ(ramp(&brighter, true, VOR_BLEND_MULTIPLY, 0.0f), ramp(&brighter));
 }
 
 TEST(ColorMatrixProcessor, FoldsOperationsUnderStrengthOrFailsUntouched) {
@@ -113,54 +82,30 @@ TEST(ColorMatrixProcessor, FoldsOperationsUnderStrengthOrFailsUntouched) {
     VorColorMatrixAdjSaturation(&half_saturated, 0.5f);
     VorColorMatrixBrightness(&steeper, 1.2f);
     VorColorMatrixContrast(&steeper, 1.0f);
-    const VorColorMatrix swap = {{0, 1, 0, 0, 1, 0, 0, 0, 0, 0, 1, 10}};
-    const VorColorMatrix half_swap = {{0.5f, 0.5f, 0, 0, 0.5f, 0.5f, 0, 0, 0, 0, 1, 5}};
-    const struct {
-        const char* operations;
-        double strength;
-        const VorColorMatrix* expected;  // null: the processor fails, pixels untouched
-    } cases[] = {
-        {R"([{"operation": "saturation", "value": 0}])", 0.5, &half_saturated},
-        {R"([{"operation": "brightness", "value": 1.2}, {"operation": "contrast", "value": 2}])", 1, &steeper},
-        {R"([])", 1, &VorColorMatrixIdentity},
-        {R"([{"operation": "brightness", "value": 3},
-             {"operation": "hardSet", "entries": [0,1,0,0, 1,0,0,0, 0,0,1,10]}])", 1, &swap},
-        {R"([{"operation": "hardSet", "gain": 2, "entries": [0,0.5,0,0, 0.5,0,0,0, 0,0,0.5,5]}])", 0.5, &half_swap},
-        {R"([{"operation": "hardSet", "entries": [9,9,9,9, 9,9,9,9, 9,9,9,9]}])", 0, &VorColorMatrixIdentity},
-        {R"({"operation": "brightness", "value": 2})", 1, nullptr},
-        {R"([{"value": 2}])", 1, nullptr},
-        {R"([7])", 1, nullptr},
-        {R"([{"operation": "brightness"}])", 1, nullptr},
-        {R"([{"operation": "contrast", "value": "2"}])", 1, nullptr},
-        {R"([{"operation": "brightness", "value": 2}, {"operation": "Saturation", "value": 1}])", 1, nullptr},
-        {R"([{"operation": "hardSet", "entries": [1,0,0,0, 0,1,0,0, 0,0,1]}])", 1, nullptr},
-        {R"([{"operation": "hardSet"}])", 1, nullptr},
-        {R"([{"operation": "hardSet", "entries": [1,0,0,0, 0,1,0,0, 0,0,1,"0"]}])", 1, nullptr},
-        {nullptr, 1, nullptr},  // no "operations" at all
+    const VorColorMatrix half_swap = {{0.5f, 0.5f, 0, 0, 0.5f, 0.5f, 0, 0, 0, 0, 1, 5}}, unchecked{};
+    const std::string swap = R"({"operation": "hardSet", "gain": 2, "entries": [0,0.5,0,0, 0.5,0,0,0, 0,0,0.5,5]})";
+    auto doc = [](const std::string& operations) { return R"({"operations": )" + operations + "}"; };
+    const struct { std::string json; double strength; const VorColorMatrix* expected; } cases[] = {  // null: fails
+        {doc(R"([{"operation": "saturation", "value": 0}])"), 0.5, &half_saturated},
+        {doc(R"([{"operation": "brightness", "value": 1.2}, {"operation": "contrast", "value": 2}])"), 1, &steeper},
+        {doc(R"([{"operation": "brightness", "value": 3}, )" + swap + "]"), 0.5, &half_swap},  // replaces so far
+        {doc("[" + swap + "]"), 0, &VorColorMatrixIdentity}, {doc("[]"), 1, &VorColorMatrixIdentity},
+        {doc(R"([{"operation": "saturation", "value": 1e999}, {"operation": "hardSet", "gain": -1e999,
+             "entries": [1,1,1,1, 1,1,1,1, 1,1,1,1e999]}])"), 1e300, &unchecked},  // non-finite: no crash
+        {"[]", 1, nullptr}, {"{}", 1, nullptr}, {doc(R"({"operation": "brightness", "value": 2})"), 1, nullptr},
+        {doc(R"([{"value": 2}])"), 1, nullptr}, {doc(R"([{"operation": "contrast", "value": "2"}])"), 1, nullptr},
+        {doc(R"([{"operation": "brightness", "value": 2}, {"operation": "Saturation", "value": 1}])"), 1, nullptr},
+        {doc(R"([{"operation": "hardSet", "entries": [1,0,0,0, 0,1,0,0, 0,0,1]}])"), 1, nullptr},
     };
     for (const auto& c : cases) {
-        const std::string json = c.operations ? std::string(R"({"operations": )") + c.operations + "}" : "{}";
-        yajl_val parameters = yajl_tree_parse(json.c_str(), nullptr, 0);
-        VLPLRunOptions options;
-        VorEffectInitParams(&options);
-        options.strength = c.strength;
-        std::vector<uint8_t> bytes = ramp_pixels();
+        yajl_val parameters = yajl_tree_parse(c.json.c_str(), nullptr, 0);
+        const VLPLRunOptions options{0, c.strength, 1, 1.0};
+        std::vector<uint8_t> bytes = ramp();
         VorBitmap bitmap{bytes.data(), 256, 1};
-        EXPECT_EQ(VLPLRunColorMatrixTransformProcessor(parameters, &bitmap, &options), c.expected ? 1 : 0) << json;
-        EXPECT_EQ(bytes, c.expected ? with_matrix(*c.expected) : ramp_pixels()) << json;
+        EXPECT_EQ(VLPLRunColorMatrixTransformProcessor(parameters, &bitmap, &options), c.expected ? 1 : 0) << c.json;
+        EXPECT_TRUE(c.expected == &unchecked || bytes == (c.expected ? ramp(c.expected) : ramp())) << c.json;
         yajl_tree_free(parameters);
     }
-    // Parameters that are no object fail; non-finite amounts apply without a crash.
-    std::vector<uint8_t> bytes = ramp_pixels();
-    VorBitmap bitmap{bytes.data(), 256, 1};
-    const VLPLRunOptions huge{0, 1e300, 1, 1.0};
-    yajl_val array = yajl_tree_parse("[]", nullptr, 0);
-    yajl_val wild = yajl_tree_parse(R"({"operations": [{"operation": "saturation", "value": 1e999},
-        {"operation": "hardSet", "gain": -1e999, "entries": [1,1,1,1, 1,1,1,1, 1,1,1,1e999]}]})", nullptr, 0);
-    EXPECT_EQ(VLPLRunColorMatrixTransformProcessor(array, &bitmap, &huge), 0);
-    EXPECT_EQ(VLPLRunColorMatrixTransformProcessor(wild, &bitmap, &huge), 1);
-    yajl_tree_free(array);
-    yajl_tree_free(wild);
 }
 
 }  // namespace

@@ -9,115 +9,66 @@
 namespace {
 
 struct Image {
-    std::vector<VorColor> pixels;
-    VorBitmap bitmap;
-    Image(uint32_t width, uint32_t height, VorColor (*pixel)(size_t))
-        : pixels(static_cast<size_t>(width) * height),
-          bitmap{reinterpret_cast<uint8_t*>(pixels.data()), width, height} {
-        for (size_t i = 0; i < pixels.size(); ++i) pixels[i] = pixel(i);
-    }
-    Image(const Image& o)
-        : pixels(o.pixels),
-          bitmap{reinterpret_cast<uint8_t*>(pixels.data()), o.bitmap.width, o.bitmap.height} {}
-    bool operator==(const Image& o) const {
-        return std::memcmp(pixels.data(), o.pixels.data(), pixels.size() * 4) == 0;
-    }
+    uint32_t w;
+    std::vector<VorColor> px;
+    VorBitmap bitmap() { return {reinterpret_cast<uint8_t*>(px.data()), w, static_cast<uint32_t>(px.size() / w)}; }
+    bool operator==(const Image& o) const { return std::memcmp(px.data(), o.px.data(), px.size() * 4) == 0; }
 };
 
-// Bytes scattered over 0..255 and biased toward both extremes; alpha 42.
-VorColor noisy(size_t i) {
-    const auto byte = [](size_t k) {
-        const unsigned v = ((k + 1) * 2654435761u) >> 24;
-        return static_cast<uint8_t>(v < 16 ? 0 : (v > 240 ? 255 : v));
-    };
-    return {byte(3 * i), byte(3 * i + 1), byte(3 * i + 2), 42};
+Image enhanced(Image img, int mode) {
+    VorBitmap b = img.bitmap();
+    VorAutoEnhance(&b, mode);
+    return img;
 }
-
-const int kModes[] = {0, 1, 2, 3, 7, -1};
 
 TEST(AutoEnhance, FixedPointsOfThePixelFormula) {
-    // Black has t = 0.5 whatever its gain: green is stored from 1.0, red
-    // and blue from 0.6, the levels stage being neutral.
-    for (int mode : kModes) {
-        Image black(5, 3, [](size_t) { return VorColor{0, 0, 0, 200}; });
-        VorAutoEnhance(&black.bitmap, mode);
-        EXPECT_TRUE(black == Image(5, 3, [](size_t) { return VorColor{0, 1, 0, 200}; }));
-    }
-    // Half white, half (200, 100, 150): no level holds more of the image
-    // than an even spread, so mode 2's gains are all exactly 1 and only
-    // green's two half-level offsets act.
-    Image image(4, 4, [](size_t i) {
-        return i % 2 ? VorColor{255, 255, 255, 3} : VorColor{200, 100, 150, 3};
-    });
-    VorAutoEnhance(&image.bitmap, 2);
-    EXPECT_TRUE(image == Image(4, 4, [](size_t i) {
-                    return i % 2 ? VorColor{255, 255, 255, 3} : VorColor{200, 101, 150, 3};
-                }));
-}
-
-TEST(AutoEnhance, GreyStaysGreyWithGreenAtMostOneLevelAbove) {
-    // For R = G = B = v the formulas reduce to red = blue = gain x v + 0.6
-    // and green = gain x v + 1.0, whatever the gain.
-    for (int mode : kModes) {
-        Image image(61, 7, [](size_t i) {
-            const uint8_t v = static_cast<uint8_t>((i * 37) % 200);
-            return VorColor{v, v, v, 17};
-        });
-        VorAutoEnhance(&image.bitmap, mode);
-        for (const VorColor& p : image.pixels) {
-            ASSERT_TRUE(p.r == p.b && (p.g == p.r || p.g == p.r + 1) && p.a == 17) << mode;
-        }
-    }
+    // Black lands on (0, 1, 0) whatever the mode; alpha is kept.
+    for (int mode : {0, 1, 2, 3, -1})
+        EXPECT_TRUE((enhanced({5, std::vector<VorColor>(15, {0, 0, 0, 200})}, mode) ==
+                     Image{5, std::vector<VorColor>(15, {0, 1, 0, 200})})) << mode;
+    // Half white, half (200, 100, 150): mode 2's gains are all 1, only green moves.
+    Image half{4, std::vector<VorColor>(16, {255, 255, 255, 3})}, expected = half;
+    for (size_t i = 0; i < 16; i += 2) half.px[i] = {200, 100, 150, 3}, expected.px[i] = {200, 101, 150, 3};
+    EXPECT_TRUE(enhanced(half, 2) == expected);
 }
 
 TEST(AutoEnhance, ModesAgreeWithTheirDefinitions) {
-    const Image original(41, 19, noisy);
-    Image mode_one = original, mode_two = original, mode_three = original;
-    VorAutoEnhance(&mode_one.bitmap, 1);
-    VorAutoEnhance(&mode_two.bitmap, 2);
-    VorAutoEnhance(&mode_three.bitmap, 3);
-    for (size_t i = 0; i < original.pixels.size(); ++i) {
-        const VorColor &before = original.pixels[i], &after = mode_two.pixels[i];
-        ASSERT_TRUE(after.r >= before.r && after.g >= before.g && after.b >= before.b) << i;
+    // Bytes biased toward both extremes, so clamping is exercised.
+    Image original{41, std::vector<VorColor>(41 * 19)};
+    for (size_t i = 0; i < original.px.size(); ++i) {
+        const auto byte = [](size_t k) {
+            const unsigned v = ((k + 1) * 2654435761u) >> 24;
+            return static_cast<uint8_t>(v < 16 ? 0 : (v > 240 ? 255 : v));
+        };
+        original.px[i] = {byte(3 * i), byte(3 * i + 1), byte(3 * i + 2), 42};
     }
-    // Mode 3 is the contrast curve 0.5 followed by mode 1.
-    Image curve_then_one = original;
-    VorBitmapContrastCurve(&curve_then_one.bitmap, 0.5f);
-    VorAutoEnhance(&curve_then_one.bitmap, 1);
-    EXPECT_TRUE(mode_three == curve_then_one);
-    for (int mode : {4, 99, -1}) {
-        Image other = original;
-        VorAutoEnhance(&other.bitmap, mode);
-        EXPECT_TRUE(other == mode_one) << mode;
+    const Image two = enhanced(original, 2);  // mode 2 never darkens
+    for (size_t i = 0; i < two.px.size(); ++i) {
+        const VorColor &a = original.px[i], &b = two.px[i];
+        ASSERT_TRUE(b.r >= a.r && b.g >= a.g && b.b >= a.b) << i;
     }
-    VorBitmap empty{nullptr, 7, 0};
-    VorAutoEnhance(&empty, 0);
-    VorLabCorrect(&empty);
+    Image curved = original;  // mode 3 is the 0.5 curve, then mode 1
+    VorBitmap b = curved.bitmap();
+    VorBitmapContrastCurve(&b, 0.5f);
+    EXPECT_TRUE(enhanced(original, 3) == enhanced(curved, 1));
+    for (int mode : {4, -1}) EXPECT_TRUE(enhanced(original, mode) == enhanced(original, 1)) << mode;
 }
 
 TEST(LabCorrect, TakesOutAboutHalfOfAUniformCast) {
-    struct Case {
-        VorColor colour;
-        int channel;  // the packed byte with the strong cast: 1 a*, 2 b*
-    } const cases[] = {
-        {{200, 170, 90, 11}, 2},   // yellow
-        {{110, 140, 230, 11}, 2},  // blue
-        {{220, 110, 170, 11}, 1},  // magenta
-        {{90, 190, 110, 11}, 1},   // green
-    };
-    for (const Case& c : cases) {
-        Image image(9, 4, [](size_t) { return VorColor{}; });
-        for (VorColor& p : image.pixels) p = c.colour;
-        VorLabCorrect(&image.bitmap);
-        VorColor before = c.colour, after = image.pixels[5];
-        EXPECT_EQ(after.a, 11);
+    // Packed byte with the strong cast: 1 is a*, 2 is b*.
+    const std::pair<VorColor, int> cases[] = {{{200, 170, 90, 11}, 2}, {{220, 110, 170, 11}, 1}};
+    for (const auto& [colour, channel] : cases) {
+        Image img{9, std::vector<VorColor>(36, colour)};
+        VorBitmap b = img.bitmap();
+        VorLabCorrect(&b);
+        VorColor before = colour, after = img.px[5];
+        ASSERT_EQ(after.a, 11);
         VorColorRGB2LAB(&before);
         VorColorRGB2LAB(&after);
-        const int cast_before = std::abs((&before.r)[c.channel] - 127);
-        const int cast_after = std::abs((&after.r)[c.channel] - 127);
-        EXPECT_GT(cast_before, 20);
-        EXPECT_LT(cast_after, cast_before * 3 / 4) << int(c.colour.r);
-        EXPECT_GT(cast_after, cast_before / 4) << int(c.colour.r);
+        const int cast_before = std::abs((&before.r)[channel] - 127);
+        const int cast_after = std::abs((&after.r)[channel] - 127);
+        EXPECT_LT(cast_after, cast_before * 3 / 4) << channel;
+        EXPECT_GT(cast_after, cast_before / 4) << channel;
     }
 }
 

