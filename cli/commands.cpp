@@ -26,7 +26,13 @@ int run_apply(const ApplyArgs& args) {
     std::optional<Image> original;
     if (args.compare) original = image;
     effect.run(image, options, args.input);
-    write_image(args.compare ? side_by_side(*original, image) : image, args.output, args.quality);
+    // Two calls rather than one conditional expression, which would copy
+    // the photo to give both branches one type.
+    if (args.compare) {
+        write_image(side_by_side(*original, image), args.output, args.quality);
+    } else {
+        write_image(image, args.output, args.quality);
+    }
     return 0;
 }
 

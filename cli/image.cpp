@@ -77,7 +77,13 @@ std::string read_file(const std::filesystem::path& path) {
     if (!in) throw Failure(path.string() + ": cannot open: " + std::strerror(errno));
     std::error_code ec;
     if (std::filesystem::is_directory(path, ec)) throw Failure(path.string() + ": is a folder, not a file");
-    std::string text{std::istreambuf_iterator<char>(in), std::istreambuf_iterator<char>()};
+    // Sized once from the file's length: growing by appending would hold up
+    // to twice a large photo's bytes for a moment.
+    std::string text(static_cast<std::size_t>(std::filesystem::file_size(path, ec)), '\0');
+    if (ec) text.clear();
+    in.read(text.data(), static_cast<std::streamsize>(text.size()));
+    text.resize(static_cast<std::size_t>(in.gcount()));
+    text.append(std::istreambuf_iterator<char>(in), std::istreambuf_iterator<char>());
     if (in.bad()) throw Failure(path.string() + ": cannot read: " + std::strerror(errno));
     return text;
 }

@@ -5,6 +5,7 @@
 #include <cstring>
 #include <cerrno>
 #include <fstream>
+#include <memory>
 
 // jpeglib.h needs size_t and FILE declared before it.
 #include <jpeglib.h>
@@ -42,11 +43,21 @@ void write_file(const std::filesystem::path& path, const void* data, std::size_t
 }
 
 // ---- PNG ---------------------------------------------------------------
+// Both directions stream through the file, so a photo is held once, as its
+// RGBA pixels, and never also as a compressed copy in memory.
 
-Image decode_png(const std::string& file, const std::filesystem::path& path) {
+using File = std::unique_ptr<std::FILE, int (*)(std::FILE*)>;
+
+File open_file(const std::filesystem::path& path, const char* mode) {
+    return File(std::fopen(path.c_str(), mode), &std::fclose);
+}
+
+Image decode_png(const std::filesystem::path& path) {
+    const File file = open_file(path, "rb");
+    if (!file) throw Failure(path.string() + ": cannot open: " + std::strerror(errno));
     png_image png{};
     png.version = PNG_IMAGE_VERSION;
-    if (!png_image_begin_read_from_memory(&png, file.data(), file.size())) {
+    if (!png_image_begin_read_from_stdio(&png, file.get())) {
         throw Failure(path.string() + ": not a readable PNG file (" + png.message + ")");
     }
     // 16-bit files without a gamma chunk hold sRGB levels like 8-bit ones,
@@ -66,33 +77,62 @@ Image decode_png(const std::string& file, const std::filesystem::path& path) {
     }
 }
 
-std::vector<uint8_t> encode_png(const Image& image, const std::filesystem::path& path) {
-    png_image png{};
-    png.version = PNG_IMAGE_VERSION;
-    png.width = image.width;
-    png.height = image.height;
-    std::vector<uint8_t> rgb;
-    const void* pixels = image.rgba.data();
-    if (is_opaque(image)) {
-        png.format = PNG_FORMAT_RGB;
-        rgb.resize(std::size_t{3} * image.width * image.height);
-        for (std::size_t i = 0, o = 0; i < image.rgba.size(); i += 4, o += 3) {
-            std::memcpy(&rgb[o], &image.rgba[i], 3);
-        }
-        pixels = rgb.data();
-    } else {
-        png.format = PNG_FORMAT_RGBA;
+struct PngErrors {
+    std::jmp_buf jump;
+    char message[200];
+};
+
+[[noreturn]] void png_fail(png_structp png, png_const_charp message) {
+    auto* errors = static_cast<PngErrors*>(png_get_error_ptr(png));
+    std::snprintf(errors->message, sizeof errors->message, "%s", message);
+    std::longjmp(errors->jump, 1);
+}
+
+void png_quiet(png_structp, png_const_charp) {}
+
+// libpng reports errors by a long jump back into this frame, so it holds no
+// object with a destructor. An opaque photo is written as RGB: libpng drops
+// the alpha byte of each row as it goes, with no RGB copy of the photo.
+bool encode_png(const Image* image, std::FILE* file, bool opaque, PngErrors* errors) {
+    png_structp png = png_create_write_struct(PNG_LIBPNG_VER_STRING, errors, png_fail, png_quiet);
+    if (png == nullptr) {
+        std::snprintf(errors->message, sizeof errors->message, "out of memory");
+        return false;
     }
-    png_alloc_size_t size = 0;
-    if (!png_image_write_to_memory(&png, nullptr, &size, 0, pixels, 0, nullptr)) {
-        throw Failure(path.string() + ": cannot encode PNG (" + png.message + ")");
+    png_infop info = nullptr;
+    if (setjmp(errors->jump)) {
+        png_destroy_write_struct(&png, &info);
+        return false;
     }
-    std::vector<uint8_t> encoded(size);
-    if (!png_image_write_to_memory(&png, encoded.data(), &size, 0, pixels, 0, nullptr)) {
-        throw Failure(path.string() + ": cannot encode PNG (" + png.message + ")");
+    info = png_create_info_struct(png);
+    if (info == nullptr) png_error(png, "out of memory");
+    png_init_io(png, file);
+    png_set_IHDR(png, info, image->width, image->height, 8,
+                 opaque ? PNG_COLOR_TYPE_RGB : PNG_COLOR_TYPE_RGB_ALPHA, PNG_INTERLACE_NONE,
+                 PNG_COMPRESSION_TYPE_DEFAULT, PNG_FILTER_TYPE_DEFAULT);
+    png_set_sRGB_gAMA_and_cHRM(png, info, PNG_sRGB_INTENT_PERCEPTUAL);
+    png_write_info(png, info);
+    if (opaque) png_set_filler(png, 0, PNG_FILLER_AFTER);
+    for (uint32_t y = 0; y < image->height; ++y) {
+        png_write_row(png, image->pixel(0, y));
     }
-    encoded.resize(size);
-    return encoded;
+    png_write_end(png, info);
+    png_destroy_write_struct(&png, &info);
+    return true;
+}
+
+void write_png(const Image& image, const std::filesystem::path& path) {
+    File file = open_file(path, "wb");
+    if (!file) throw Failure(path.string() + ": cannot create: " + std::strerror(errno));
+    PngErrors errors{};
+    const bool encoded = encode_png(&image, file.get(), is_opaque(image), &errors);
+    const int error = errno;
+    const bool closed = std::fclose(file.release()) == 0;
+    if (encoded && closed) return;
+    std::error_code ignored;
+    std::filesystem::remove(path, ignored);
+    if (!encoded) throw Failure(path.string() + ": cannot write PNG (" + errors.message + ")");
+    throw Failure(path.string() + ": cannot write: " + std::strerror(error));
 }
 
 // ---- JPEG --------------------------------------------------------------
@@ -213,15 +253,17 @@ Image decode_jpeg_upright(const std::string& file, const std::filesystem::path& 
 }  // namespace
 
 Image read_image(const std::filesystem::path& path) {
-    const Format format = require_format(path);
-    const std::string file = read_file(path);
-    return format == Format::png ? decode_png(file, path) : decode_jpeg_upright(file, path);
+    if (require_format(path) == Format::png) {
+        std::error_code ec;
+        if (std::filesystem::is_directory(path, ec)) throw Failure(path.string() + ": is a folder, not a file");
+        return decode_png(path);
+    }
+    return decode_jpeg_upright(read_file(path), path);
 }
 
 void write_image(const Image& image, const std::filesystem::path& path, int quality) {
     if (require_format(path) == Format::png) {
-        const std::vector<uint8_t> encoded = encode_png(image, path);
-        write_file(path, encoded.data(), encoded.size());
+        write_png(image, path);
         return;
     }
     JpegErrors errors;
