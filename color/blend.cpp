@@ -86,8 +86,51 @@ inline float mix_color_mode(int b, int c, float op, float a) {
 
 }  // namespace
 
+namespace {
+
+template <float (*Rule)(int, int, float, float)>
+void fill_channel_row(int source_level, float op, std::uint8_t row[256]) {
+    const float a = 1.0f - op;
+    for (int b = 0; b < 256; ++b) row[b] = core::store_truncated(Rule(b, source_level, op, a));
+}
+
+}  // namespace
+
+bool blend_channel_row(std::uint32_t mode, int source_level, float opacity, std::uint8_t row[256]) {
+    switch (mode) {
+        case VOR_BLEND_NORMAL:
+            fill_channel_row<blend_normal>(source_level, opacity, row);
+            return true;
+        case VOR_BLEND_OVERLAY:
+            fill_channel_row<blend_overlay>(source_level, opacity, row);
+            return true;
+        case VOR_BLEND_COLOR:
+            return false;
+        case VOR_BLEND_SCREEN:
+            fill_channel_row<blend_screen>(source_level, opacity, row);
+            return true;
+        case VOR_BLEND_DARKEN:
+            fill_channel_row<blend_darken>(source_level, opacity, row);
+            return true;
+        case VOR_BLEND_MULTIPLY:
+            fill_channel_row<blend_multiply>(source_level, opacity, row);
+            return true;
+        case VOR_BLEND_SOFT_LIGHT:
+            fill_channel_row<blend_soft_light>(source_level, opacity, row);
+            return true;
+        default:
+            for (int b = 0; b < 256; ++b) row[b] = 0;
+            return true;
+    }
+}
+
 void blend_grey_maps(const VorColor& src, std::uint32_t mode, float opacity, std::uint8_t red[256],
                      std::uint8_t green[256], std::uint8_t blue[256]) {
+    if (blend_channel_row(mode, src.r, opacity, red)) {
+        blend_channel_row(mode, src.g, opacity, green);
+        blend_channel_row(mode, src.b, opacity, blue);
+        return;
+    }
     for (int v = 0; v < 256; ++v) {
         const auto level = static_cast<std::uint8_t>(v);
         VorColor grey{level, level, level, 255};

@@ -24,6 +24,12 @@ const EncodingTable& encoding_table();
 void blend_grey_maps(const VorColor& src, std::uint32_t mode, float opacity, std::uint8_t red[256],
                      std::uint8_t green[256], std::uint8_t blue[256]);
 
+// One channel of every mode but the colour mode depends on that channel's
+// destination and source levels alone: row[b] is the channel of
+// VorColorBlend over destination level b from the given source level.
+// Returns false, leaving row alone, for the colour mode.
+bool blend_channel_row(std::uint32_t mode, int source_level, float opacity, std::uint8_t row[256]);
+
 // Colour matrices: the general per-pixel path of VorBitmapColorMatrixTransform,
 // which never takes the diagonal table shortcut; both must give the same
 // bytes for a matrix without cross-channel terms.

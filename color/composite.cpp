@@ -38,13 +38,7 @@ constexpr std::size_t k_pair_table_threshold = 65536;
 std::unique_ptr<std::uint8_t[]> channel_pair_table(std::uint32_t mode, float opacity) {
     std::unique_ptr<std::uint8_t[]> table(new (std::nothrow) std::uint8_t[256 * 256]);
     if (!table) return table;
-    std::uint8_t unused_green[256];
-    std::uint8_t unused_blue[256];
-    for (int s = 0; s < 256; ++s) {
-        const auto level = static_cast<std::uint8_t>(s);
-        blend_grey_maps(VorColor{level, level, level, 255}, mode, opacity, &table[s * 256],
-                        unused_green, unused_blue);
-    }
+    for (int s = 0; s < 256; ++s) blend_channel_row(mode, s, opacity, &table[s * 256]);
     return table;
 }
 
