@@ -57,7 +57,43 @@ inline float blend_soft_light(int b, int s, float op, float a) {
     return static_cast<float>(t) * op + a * static_cast<float>(b);
 }
 
-template <float (*Rule)(int, int, float, float)>
+// Modes without a rule of their own blacken the colour channels.
+inline float blend_unknown(int, int, float, float) { return 0.0f; }
+
+using ChannelRule = float (*)(int, int, float, float);
+
+// Calls visit.operator()<Rule>() with the channel rule of a mode; false,
+// without calling, for the colour mode, which mixes whole colours.
+template <typename Visit>
+bool visit_channel_rule(std::uint32_t mode, Visit&& visit) {
+    switch (mode) {
+        case VOR_BLEND_NORMAL:
+            visit.template operator()<blend_normal>();
+            return true;
+        case VOR_BLEND_OVERLAY:
+            visit.template operator()<blend_overlay>();
+            return true;
+        case VOR_BLEND_COLOR:
+            return false;
+        case VOR_BLEND_SCREEN:
+            visit.template operator()<blend_screen>();
+            return true;
+        case VOR_BLEND_DARKEN:
+            visit.template operator()<blend_darken>();
+            return true;
+        case VOR_BLEND_MULTIPLY:
+            visit.template operator()<blend_multiply>();
+            return true;
+        case VOR_BLEND_SOFT_LIGHT:
+            visit.template operator()<blend_soft_light>();
+            return true;
+        default:
+            visit.template operator()<blend_unknown>();
+            return true;
+    }
+}
+
+template <ChannelRule Rule>
 inline void blend_channels(VorColor& dst, const VorColor& src, float op) {
     const float a = 1.0f - op;
     dst.r = core::store_truncated(Rule(dst.r, src.r, op, a));
@@ -88,7 +124,7 @@ inline float mix_color_mode(int b, int c, float op, float a) {
 
 namespace {
 
-template <float (*Rule)(int, int, float, float)>
+template <ChannelRule Rule>
 void fill_channel_row(int source_level, float op, std::uint8_t row[256]) {
     const float a = 1.0f - op;
     for (int b = 0; b < 256; ++b) row[b] = core::store_truncated(Rule(b, source_level, op, a));
@@ -97,31 +133,8 @@ void fill_channel_row(int source_level, float op, std::uint8_t row[256]) {
 }  // namespace
 
 bool blend_channel_row(std::uint32_t mode, int source_level, float opacity, std::uint8_t row[256]) {
-    switch (mode) {
-        case VOR_BLEND_NORMAL:
-            fill_channel_row<blend_normal>(source_level, opacity, row);
-            return true;
-        case VOR_BLEND_OVERLAY:
-            fill_channel_row<blend_overlay>(source_level, opacity, row);
-            return true;
-        case VOR_BLEND_COLOR:
-            return false;
-        case VOR_BLEND_SCREEN:
-            fill_channel_row<blend_screen>(source_level, opacity, row);
-            return true;
-        case VOR_BLEND_DARKEN:
-            fill_channel_row<blend_darken>(source_level, opacity, row);
-            return true;
-        case VOR_BLEND_MULTIPLY:
-            fill_channel_row<blend_multiply>(source_level, opacity, row);
-            return true;
-        case VOR_BLEND_SOFT_LIGHT:
-            fill_channel_row<blend_soft_light>(source_level, opacity, row);
-            return true;
-        default:
-            for (int b = 0; b < 256; ++b) row[b] = 0;
-            return true;
-    }
+    return visit_channel_rule(
+        mode, [&]<ChannelRule Rule>() { fill_channel_row<Rule>(source_level, opacity, row); });
 }
 
 void blend_grey_maps(const VorColor& src, std::uint32_t mode, float opacity, std::uint8_t red[256],
@@ -148,36 +161,13 @@ using namespace vorlite::color;
 extern "C" {
 
 VOR_API void VorColorBlend(VorColor* dst, const VorColor* src, uint32_t mode, float opacity) {
-    switch (mode) {
-        case VOR_BLEND_NORMAL:
-            blend_channels<blend_normal>(*dst, *src, opacity);
-            return;
-        case VOR_BLEND_OVERLAY:
-            blend_channels<blend_overlay>(*dst, *src, opacity);
-            return;
-        case VOR_BLEND_COLOR: {
-            float hsl[3];
-            VorColorRGB2HSL(src, hsl);
-            const VorColor target = color_mode_target(*dst, hsl, src->a);
-            blend_channels<mix_color_mode>(*dst, target, opacity);
-            return;
-        }
-        case VOR_BLEND_SCREEN:
-            blend_channels<blend_screen>(*dst, *src, opacity);
-            return;
-        case VOR_BLEND_DARKEN:
-            blend_channels<blend_darken>(*dst, *src, opacity);
-            return;
-        case VOR_BLEND_MULTIPLY:
-            blend_channels<blend_multiply>(*dst, *src, opacity);
-            return;
-        case VOR_BLEND_SOFT_LIGHT:
-            blend_channels<blend_soft_light>(*dst, *src, opacity);
-            return;
-        default:
-            dst->r = dst->g = dst->b = 0;
-            return;
+    if (visit_channel_rule(mode, [&]<ChannelRule Rule>() { blend_channels<Rule>(*dst, *src, opacity); })) {
+        return;
     }
+    float hsl[3];
+    VorColorRGB2HSL(src, hsl);
+    const VorColor target = color_mode_target(*dst, hsl, src->a);
+    blend_channels<mix_color_mode>(*dst, target, opacity);
 }
 
 VOR_API void VorColorBlendColorMode(VorColor* dst, const float srcHSL[3], int32_t srcAlpha,
