@@ -52,7 +52,7 @@ echo "bench: checking that each peer does the same work as the library"
 "$build/bench/vorlite_bench_tests" --gtest_brief=1
 
 documents=()
-for d in "$root"/examples/effects/*.json "$root"/bench/five-step-look.json; do
+for d in "$root"/examples/effects/*.json; do
   [ -f "$d" ] && documents+=("--document=${d#"$root"/}")
 done
 common=(--photo="${photo#"$root"/}" --benchmark_repetitions="$repetitions"
@@ -74,7 +74,7 @@ if [ "$have_tool" -eq 1 ]; then
   large=$build/photo-12mp.png
   "$build/bench/vorlite_bench" --photo="$photo" --write-photo="$large"
   document=$(sed -n 's/^ *"document": "\(.*\)",\{0,1\}$/\1/p' "$build/single.json" | head -n 1)
-  [ -n "$document" ] || document=bench/five-step-look.json
+  [ -n "$document" ] || document=examples/effects/warm-crisp-grain.json
   /usr/bin/time -v "$build/cli/vorlite" apply "$root/$document" "$large" "$build/photo-12mp-out.png" \
     2>"$build/time.txt" >/dev/null
   peak=$(sed -n 's/.*Maximum resident set size (kbytes): *\([0-9]*\).*/\1/p' "$build/time.txt")
