@@ -1,13 +1,20 @@
 // Colour matrices: 3 x 4 affine transforms of (red, green, blue), their
 // builders, their application to a bitmap and the "colorMatrixTransform"
 // processor.
+#include <bit>
 #include <cstddef>
 #include <cstdint>
+#include <cstring>
 #include <string_view>
 
 #include "color/color_internal.h"
 #include "core/core_internal.h"
+#include "core/simd.h"
 #include "proclist/proclist_internal.h"
+
+#if defined(__SSE__)
+#include <xmmintrin.h>
+#endif
 
 namespace vorlite::color {
 namespace {
@@ -84,6 +91,101 @@ bool fold_operation(yajl_val operation, double strength, VorColorMatrix* matrix)
     return true;
 }
 
+}  // namespace
+
+// Four pixels at a time, one pixel per lane and one vector per channel.
+// Every lane performs the scalar steps of color_matrix_per_pixel: the same
+// float products and sums in the same order, then store_rounded's rule with
+// the half added in double precision.
+namespace {
+namespace lanes {
+
+using core::simd::f32x4;
+using core::simd::i32x4;
+using core::simd::splat;
+using u32x4 = std::uint32_t __attribute__((vector_size(16)));
+using f64x4 = double __attribute__((vector_size(32)));
+
+// Little-endian RGBA: red is the low byte of each 32-bit pixel.
+static_assert(std::endian::native == std::endian::little);
+
+// Through signed lanes: a byte fits, and SSE2 converts only signed integers.
+inline f32x4 channel(u32x4 pixels, int shift) {
+    return __builtin_convertvector(__builtin_convertvector((pixels >> shift) & 0xFFu, i32x4), f32x4);
+}
+
+// v > bound ? v : bound, and v < bound ? v : bound: a NaN lane gives the
+// bound. SSE's max and min have exactly these semantics (second operand on
+// NaN or equality); the compiler does not pick them for a constant bound.
+inline f32x4 max_or_bound(f32x4 v, f32x4 bound) {
+#if defined(__SSE__)
+    return _mm_max_ps(v, bound);
+#else
+    return v > bound ? v : bound;
+#endif
+}
+
+inline f32x4 min_or_bound(f32x4 v, f32x4 bound) {
+#if defined(__SSE__)
+    return _mm_min_ps(v, bound);
+#else
+    return v < bound ? v : bound;
+#endif
+}
+
+// store_rounded for four lanes. Clamping to -0.5..254.5 first is exact
+// (both bounds are floats and widening is exact) and maps every value the
+// rule sends to 0 or 255 onto a bound that rounds to the same byte:
+// below -0.5 and NaN to -0.5, above 254.5 and
+// +infinity to 254.5. The in-range lanes then take trunc(v + 0.5) in double.
+inline i32x4 round_to_bytes(f32x4 v) {
+    const f32x4 low = splat(-0.5f);
+    const f32x4 high = splat(254.5f);
+    const f32x4 clamped = min_or_bound(max_or_bound(v, low), high);
+    const f64x4 widened = __builtin_convertvector(clamped, f64x4);
+    return __builtin_convertvector(widened + 0.5, i32x4);
+}
+
+inline u32x4 round_to_bytes_at(f32x4 v, int shift) {
+    return __builtin_convertvector(round_to_bytes(v), u32x4) << shift;
+}
+
+// Each of the twelve matrix entries in all four lanes.
+struct MatrixLanes {
+    f32x4 m[12];
+};
+
+inline void transform_four(std::uint8_t* p, const MatrixLanes& k) {
+    u32x4 pixels;
+    std::memcpy(&pixels, p, 16);
+    const f32x4 r = channel(pixels, 0), g = channel(pixels, 8), b = channel(pixels, 16);
+    const f32x4 red = ((g * k.m[1] + k.m[3]) + r * k.m[0]) + b * k.m[2];
+    const f32x4 green = ((r * k.m[4] + k.m[7]) + g * k.m[5]) + b * k.m[6];
+    const f32x4 blue = ((r * k.m[8] + k.m[11]) + g * k.m[9]) + b * k.m[10];
+    const u32x4 alpha = pixels & 0xFF000000u;
+    const u32x4 out = alpha | round_to_bytes_at(red, 0) | round_to_bytes_at(green, 8) |
+                      round_to_bytes_at(blue, 16);
+    std::memcpy(p, &out, 16);
+}
+
+void transform(VorBitmap* bitmap, const VorColorMatrix& matrix) {
+    MatrixLanes k;
+    for (int i = 0; i < 12; ++i) k.m[i] = splat(matrix.m[i]);
+    const std::size_t n = core::pixel_count(*bitmap);
+    std::uint8_t* p = bitmap->data;
+    std::size_t i = 0;
+    for (; i + 4 <= n; i += 4, p += 16) transform_four(p, k);
+    // The last one to three pixels go through the same lanes from a padded
+    // copy, so no byte past the bitmap is read or written.
+    const std::size_t rest = (n - i) * 4;
+    if (rest == 0) return;
+    std::uint8_t block[16] = {};
+    std::memcpy(block, p, rest);
+    transform_four(block, k);
+    std::memcpy(p, block, rest);
+}
+
+}  // namespace lanes
 }  // namespace
 
 void color_matrix_per_pixel(VorBitmap* bitmap, const VorColorMatrix& matrix) {
@@ -170,7 +272,7 @@ VOR_API void VorColorMatrixContrast(VorColorMatrix* matrix, float c) {
 VOR_API void VorBitmapColorMatrixTransform(VorBitmap* bitmap, const VorColorMatrix* matrix) {
     const float* m = matrix->m;
     if (transform_diagonal(bitmap, m)) return;
-    color_matrix_per_pixel(bitmap, *matrix);
+    lanes::transform(bitmap, *matrix);
 }
 
 VOR_API void VorBitmapColorMatrixTransformAndBlendWithOriginal(VorBitmap* bitmap,

@@ -2,6 +2,8 @@
 
 #include <cstdint>
 #include <cstring>
+#include <limits>
+#include <random>
 #include <string>
 #include <vector>
 
@@ -65,6 +67,56 @@ TEST(ColorMatrix, FastAndGeneralPathsRoundHalfUpAndAgree) {
         VorBitmap bitmap{general.data(), 256, 1};
         vorlite::color::color_matrix_per_pixel(&bitmap, m);
         EXPECT_EQ(ramp(&m), general) << m.m[0];
+    }
+}
+
+// The bitmap transform of a cross-channel matrix runs four pixels per step
+// and the last one to three from a padded block; it must store the bytes of
+// the general per-pixel path, including where the rounding rule meets
+// infinities, NaN and sums beyond the byte range.
+TEST(ColorMatrix, CrossChannelLanesMatchGeneralPathAtEveryWidthAndExtreme) {
+    constexpr float inf = std::numeric_limits<float>::infinity(), nan = std::numeric_limits<float>::quiet_NaN();
+    constexpr float tiny = std::numeric_limits<float>::denorm_min(), big = std::numeric_limits<float>::max();
+    const VorColorMatrix matrices[] = {
+        {{0.393f, 0.769f, 0.189f, 0, 0.349f, 0.686f, 0.168f, 0, 0.272f, 0.534f, 0.131f, 0}},  // sepia, overflows
+        {{0.5f, 0.5f, 0, 0.5f, 0, 0.5f, 0.5f, -0.5f, 0.5f, 0, 0.5f, 254.5f}},               // halves: rounding ties
+        {{-1, 1, -1, 255, 1, -1, 1, -0.5f, 0.25f, -0.75f, 1.5f, 0}},                          // below -0.5 and back
+        {{0.7f, 0.1f, 0.2f, 0.3f, 0.1f, 0.7f, 0.2f, 0.3f, 0.1f, 0.7f, 0.2f, 0.3f}},  // the sum order shows in the bytes
+        {{1, 0x1p-24f, 0, 0x1.fffffep-2f, 0, 1, -0x1p-24f, 0x1.000002p-1f, tiny, 0, 1, -tiny}},       // a hair off the ties
+        {{inf, 1, 0, 0, 1, -inf, 0, 0, 0, 1, 1, inf}},      // inf x 0 is NaN, +inf saturates
+        {{nan, 1, 0, 0, 0, 1, nan, 0, 0, 0, 1, nan}},       // NaN stores 0
+        {{big, big, big, 0, -big, -big, 0, 0, big, -big, 0, 0}},  // sums overflow to infinities and NaN
+        {{1e30f, -1e30f, 0, 0, 1e-30f, 1, 1e-30f, -1e-30f, 0, 1e-38f, 1, 0.5f}},  // huge cancels, tiny vanish
+    };
+    // The lanes (through the public entry) and the general path on copies of the same bytes.
+    auto agree = [](const VorColorMatrix& m, std::vector<uint8_t> lanes, uint32_t width, uint32_t height) {
+        std::vector<uint8_t> general = lanes;
+        VorBitmap lanes_bitmap{lanes.data(), width, height}, general_bitmap{general.data(), width, height};
+        VorBitmapColorMatrixTransform(&lanes_bitmap, &m);
+        vorlite::color::color_matrix_per_pixel(&general_bitmap, m);
+        return lanes == general;
+    };
+    std::mt19937 random(20261122);
+    // Bytes biased to 0 and 255, where clamping and rounding turn; alpha 42.
+    auto biased = [&random](std::size_t pixels) {
+        std::vector<uint8_t> bytes(pixels * 4);
+        for (std::size_t i = 0; i < bytes.size(); ++i) {
+            const unsigned pick = random() % 8;
+            bytes[i] = i % 4 == 3 ? 42 : pick < 3 ? 0 : pick < 6 ? 255 : random() % 256;
+        }
+        return bytes;
+    };
+    // Every (red, green) pair with blue running through its levels: a sum
+    // taken in another order rounds differently somewhere here.
+    std::vector<uint8_t> pairs(65537 * 4);
+    for (std::size_t i = 0; i < 65537; ++i) pairs[i * 4] = i, pairs[i * 4 + 1] = i >> 8, pairs[i * 4 + 2] = i * 37, pairs[i * 4 + 3] = 42;
+    for (const VorColorMatrix& m : matrices) {
+        for (uint32_t width : {1u, 2u, 3u, 4u, 5u, 7u, 8u, 13u, 61u}) {
+            for (uint32_t height : {1u, 3u}) {
+                EXPECT_TRUE(agree(m, biased(width * height), width, height)) << m.m[0] << ", " << width << " x " << height;
+            }
+        }
+        EXPECT_TRUE(agree(m, pairs, 65537, 1)) << "matrix starting " << m.m[0];
     }
 }
 
