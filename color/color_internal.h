@@ -30,6 +30,11 @@ void blend_grey_maps(const VorColor& src, std::uint32_t mode, float opacity, std
 // Returns false, leaving row alone, for the colour mode.
 bool blend_channel_row(std::uint32_t mode, int source_level, float opacity, std::uint8_t row[256]);
 
+// Colour matrices: the three tone tables of a matrix without cross-channel
+// terms, the same bytes as transforming each level; false, leaving map
+// alone, for any other matrix.
+bool diagonal_matrix_map(const VorColorMatrix& matrix, VorHistMap* map);
+
 // Colour matrices: the general per-pixel path of VorBitmapColorMatrixTransform,
 // which never takes the diagonal table shortcut; both must give the same
 // bytes for a matrix without cross-channel terms.

@@ -30,20 +30,10 @@ bool is_diagonal(const float* m) {
            m[9] == 0.0f;
 }
 
-void diagonal_map(const float* m, VorHistMap* map) {
-    for (int v = 0; v < 256; ++v) {
-        const float level = static_cast<float>(v);
-        map->map[0][v] = round_channel(level * m[0] + m[3]);
-        map->map[1][v] = round_channel(level * m[5] + m[7]);
-        map->map[2][v] = round_channel(level * m[10] + m[11]);
-    }
-}
-
 // Applies a diagonal matrix through its tables; true when it was one.
-bool transform_diagonal(VorBitmap* bitmap, const float* m) {
-    if (!is_diagonal(m)) return false;
+bool transform_diagonal(VorBitmap* bitmap, const VorColorMatrix& matrix) {
     VorHistMap map;
-    diagonal_map(m, &map);
+    if (!diagonal_matrix_map(matrix, &map)) return false;
     VorBitmapHistogramTransform(bitmap, &map);
     return true;
 }
@@ -188,6 +178,18 @@ void transform(VorBitmap* bitmap, const VorColorMatrix& matrix) {
 }  // namespace lanes
 }  // namespace
 
+bool diagonal_matrix_map(const VorColorMatrix& matrix, VorHistMap* map) {
+    const float* m = matrix.m;
+    if (!is_diagonal(m)) return false;
+    for (int v = 0; v < 256; ++v) {
+        const float level = static_cast<float>(v);
+        map->map[0][v] = round_channel(level * m[0] + m[3]);
+        map->map[1][v] = round_channel(level * m[5] + m[7]);
+        map->map[2][v] = round_channel(level * m[10] + m[11]);
+    }
+    return true;
+}
+
 void color_matrix_per_pixel(VorBitmap* bitmap, const VorColorMatrix& matrix) {
     const float* m = matrix.m;
     const float m0 = m[0], m1 = m[1], m2 = m[2], m3 = m[3];
@@ -270,8 +272,7 @@ VOR_API void VorColorMatrixContrast(VorColorMatrix* matrix, float c) {
 }
 
 VOR_API void VorBitmapColorMatrixTransform(VorBitmap* bitmap, const VorColorMatrix* matrix) {
-    const float* m = matrix->m;
-    if (transform_diagonal(bitmap, m)) return;
+    if (transform_diagonal(bitmap, *matrix)) return;
     lanes::transform(bitmap, *matrix);
 }
 
@@ -281,7 +282,7 @@ VOR_API void VorBitmapColorMatrixTransformAndBlendWithOriginal(VorBitmap* bitmap
     if (vorlite::core::pixel_count(*bitmap) == 0) return;
     const float* m = matrix->m;
     // A diagonal matrix takes full effect: mode and opacity are ignored.
-    if (transform_diagonal(bitmap, m)) return;
+    if (transform_diagonal(bitmap, *matrix)) return;
     const float m0 = m[0], m1 = m[1], m2 = m[2], m3 = m[3];
     const float m4 = m[4], m5 = m[5], m6 = m[6], m7 = m[7];
     const float m8 = m[8], m9 = m[9], m10 = m[10], m11 = m[11];

@@ -2,6 +2,7 @@
 // their 0.5th percentile to their 99.5th percentile (or a ceiling colour's
 // channel, if higher), faded toward no change, and applied as two colour
 // matrices without cross-channel terms, that is as two lookup tables.
+#include "color/color_internal.h"
 #include "proclist/proclist_internal.h"
 #include "tone/tone_internal.h"
 
@@ -53,7 +54,6 @@ VOR_API void VorAutoColorsFadeMaxColor(VorBitmap* bitmap, double fade, const Vor
     VorColorMatrix shift;
     VorColorMatrixSetIdentity(&shift);
     for (int c = 0; c < 3; ++c) shift.m[kOffset[c]] = static_cast<float>(-lo[c]);
-    VorBitmapColorMatrixTransform(bitmap, &shift);
 
     // hi already holds the unchanged share 255 (1 - fade) and is weighed by
     // (1 - fade) once more. Without a ceiling above hi this is just
@@ -65,7 +65,15 @@ VOR_API void VorAutoColorsFadeMaxColor(VorBitmap* bitmap, double fade, const Vor
         const double span = hi[c] * (1.0 - fade) - lo[c] + top[c] * fade;
         stretch.m[kDiagonal[c]] = static_cast<float>(255.0 / span);
     }
-    VorBitmapColorMatrixTransform(bitmap, &stretch);
+
+    // Both matrices lack cross-channel terms, so each is a byte table per
+    // channel and the two transforms make one pass of their composition.
+    VorHistMap shift_map;
+    VorHistMap stretch_map;
+    vorlite::color::diagonal_matrix_map(shift, &shift_map);
+    vorlite::color::diagonal_matrix_map(stretch, &stretch_map);
+    VorHistMapMap(&shift_map, &stretch_map);
+    VorBitmapHistogramTransform(bitmap, &shift_map);
 }
 
 VOR_API void VorAutoColorsFade(VorBitmap* bitmap, double fade) {
