@@ -53,6 +53,16 @@ TEST(BitmapCompositing, EveryPathMatchesTheDirectBlend) {
         VorBitmapBlendWithColor(&coloured.bitmap, &colour, mode, 0.37f);
         EXPECT_TRUE(dst.px == expected && coloured.px == with_colour) << "mode " << mode;
     }
+    // Normal mode at opacities whose table is a plain weighted mean of the
+    // two levels takes a sixteen-channel path (the odd width leaves a tail);
+    // at the others, the table.
+    for (const float opacity : {0.5f, 0.0f, 1.0f, 0.25f, 0.3f, 0.75f}) {
+        Image dst(257, 256, 9u);
+        std::vector<VorColor> expected = dst.px;
+        for (std::size_t i = 0; i < expected.size(); ++i) VorColorBlend(&expected[i], &src.px[i], VOR_BLEND_NORMAL, opacity);
+        VorBitmapBlendBitmap(&dst.bitmap, &src.bitmap, VOR_BLEND_NORMAL, opacity);
+        EXPECT_TRUE(dst.px == expected) << "opacity " << opacity;
+    }
 }
 
 // Half a pixel right, the first column samples at -0.5, the last mixes the edge with white.
