@@ -1,8 +1,11 @@
 // Entry points built on the box-hybrid filter: two-pass sharpening and
 // blurring, a sharpened copy blended back over the original, soft focus,
 // the light anti-aliasing blur and the "sharpness" processor.
+#include <cstring>
+
 #include "core/core_internal.h"
 #include "proclist/proclist_internal.h"
+#include "tone/tone_internal.h"
 
 namespace {
 
@@ -34,6 +37,15 @@ constexpr float kSoftFocusOriginalWeight = 0.6f;
 // jagged edges.
 constexpr float kAntialiasAmount = -5.0f;
 
+// The soft-focus mix of one row, the blurred pixels weighted first: row
+// holds the original pixels and receives the result.
+void mix_soft_focus_row(std::uint8_t* row, std::uint8_t* blurred, std::uint32_t width) {
+    VorBitmap mixed{blurred, width, 1};
+    const VorBitmap original{row, width, 1};
+    VorBitmapBlendBitmapSeparate(&mixed, &original, kSoftFocusBlurWeight, kSoftFocusOriginalWeight);
+    std::memcpy(row, blurred, std::size_t{4} * width);
+}
+
 }  // namespace
 
 extern "C" {
@@ -64,6 +76,16 @@ VOR_API void VorConvolutionProcessorSharpenAndBlendWithOriginal(VorBitmap* bitma
 
 VOR_API int VorConvolutionEffectSoftFocus(VorBitmap* bitmap) {
     VorBitmapBeginGLEffectIfEnabled(bitmap);
+    // Streamed, the mix needs only the row being finished, not a whole copy.
+    switch (vorlite::tone::box_hybrid_two_passes(bitmap, kSoftFocusAmount, mix_soft_focus_row)) {
+        case vorlite::tone::TwoPasses::done:
+            VorBitmapEndGLEffectIfEnabled(bitmap);
+            return 1;
+        case vorlite::tone::TwoPasses::out_of_memory:
+            return 0;
+        case vorlite::tone::TwoPasses::unavailable:
+            break;
+    }
     WorkingCopy original;
     if (!original.make(*bitmap)) return 0;
     VorConvolutionEffectBoxHybridSharpen(bitmap, kSoftFocusAmount);

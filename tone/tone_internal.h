@@ -56,6 +56,18 @@ bool box_hybrid_shape(std::uint32_t width, std::uint32_t height, float amount,
                       BoxHybridShape* shape);
 // The 2r + 1 box weights on the 4096 fixed-point scale, truncated.
 void box_hybrid_weights(const BoxHybridShape& shape, std::int32_t* weights);
+// One pass (rows, or columns when `columns`) computed the plain way from the
+// integral lines, for holding the vectorised running-sum form against.
+void box_hybrid_pass_reference(VorBitmap* bitmap, float amount, bool columns);
+// Both passes with the vertical one streamed right behind the horizontal
+// one, so that each row of the bitmap is read and written once. `finish`
+// receives each bitmap row, still holding its original pixels, and the row
+// filtered by both passes (scratch it may change); it stores the result.
+// Unavailable when the passes would not touch the bitmap or the kernel
+// suits only the reference form: the caller then runs the passes itself.
+enum class TwoPasses { done, unavailable, out_of_memory };
+using FinishRow = void (*)(std::uint8_t* row, std::uint8_t* filtered, std::uint32_t width);
+TwoPasses box_hybrid_two_passes(VorBitmap* bitmap, float amount, FinishRow finish);
 
 // Auto colours and auto enhance: the per-channel histogram of a bitmap and
 // its cumulative distribution, held in zeroed working buffers that are

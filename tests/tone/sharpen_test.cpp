@@ -117,6 +117,34 @@ TEST(BoxHybridPass, RowsMatchAClampedBoxConvolutionAndColumnsTheTransposedRows) 
     }
 }
 
+TEST(BoxHybridPass, RunningSumFormStoresTheBytesOfTheIntegralLineForm) {
+    // Widths around the four-pixel groups and the 128-column strips, lines
+    // shorter than the kernel, one-pixel lines, boxes of 1, 3, 5 and wider.
+    const struct {
+        uint32_t width, height;
+        float amount;
+    } cases[] = {{1, 1, 100.0f},     {1, 17, -700.0f},   {17, 1, 700.0f},    {2, 3, 9000.0f},
+                 {3, 29, -2500.0f},  {5, 6, 100.0f},     {131, 9, 100.0f},   {130, 7, -400.0f},
+                 {257, 33, 107.0f},  {255, 61, -420.0f}, {64, 300, 250.0f},  {9, 200, -3000.0f},
+                 {31, 47, 60000.0f}, {40, 30, -100.0f},  {129, 128, -5.0f},  {6, 5, -200000.0f}};
+    for (const auto& c : cases) {
+        for (bool columns : {false, true}) {
+            Image fast(c.width, c.height);
+            Image reference = fast;
+            (columns ? VorBoxHybridSharpenY : VorBoxHybridSharpenX)(&fast.bitmap, c.amount);
+            vorlite::tone::box_hybrid_pass_reference(&reference.bitmap, c.amount, columns);
+            ASSERT_EQ(fast.bytes, reference.bytes) << c.width << "x" << c.height << " " << c.amount << " " << columns;
+        }
+        // Both passes streamed together match the reference passes in turn.
+        Image both(c.width, c.height);
+        Image reference = both;
+        VorConvolutionEffectBoxHybridSharpen(&both.bitmap, c.amount);
+        vorlite::tone::box_hybrid_pass_reference(&reference.bitmap, c.amount, false);
+        vorlite::tone::box_hybrid_pass_reference(&reference.bitmap, c.amount, true);
+        ASSERT_EQ(both.bytes, reference.bytes) << c.width << "x" << c.height << " " << c.amount;
+    }
+}
+
 TEST(BoxHybridPass, ZeroOrUndefinedAmountLeavesBitmapAloneAndAbsurdOnesKeepAlpha) {
     Image image(19, 11);
     const std::vector<uint8_t> before = image.bytes;
@@ -149,9 +177,10 @@ TEST(SharpenEntryPoints, AllRunTheSameTwoPasses) {
 }
 
 TEST(SoftFocus, HalfTheBlurPlusSixTenthsOfTheOriginal) {
-    const Image original(40, 30);
+    const Image original(1203, 7);  // five boxes of 3 pixels, reaching past every row
     Image image = original, blurred = original;
-    VorConvolutionEffectBoxHybridSharpen(&blurred.bitmap, -100.0f);
+    vorlite::tone::box_hybrid_pass_reference(&blurred.bitmap, -100.0f, false);
+    vorlite::tone::box_hybrid_pass_reference(&blurred.bitmap, -100.0f, true);
     EXPECT_EQ(VorConvolutionEffectSoftFocus(&image.bitmap), 1);
     for (size_t i = 0; i < image.bytes.size(); ++i) {
         const float sum = 0.6f * original.bytes[i] + 0.5f * blurred.bytes[i];
