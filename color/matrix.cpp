@@ -12,10 +12,6 @@
 #include "core/simd.h"
 #include "proclist/proclist_internal.h"
 
-#if defined(__SSE__)
-#include <xmmintrin.h>
-#endif
-
 namespace vorlite::color {
 namespace {
 
@@ -92,9 +88,11 @@ namespace lanes {
 
 using core::simd::f32x4;
 using core::simd::i32x4;
+using core::simd::f64x4;
+using core::simd::max_or_bound;
+using core::simd::min_or_bound;
 using core::simd::splat;
-using u32x4 = std::uint32_t __attribute__((vector_size(16)));
-using f64x4 = double __attribute__((vector_size(32)));
+using core::simd::u32x4;
 
 // Little-endian RGBA: red is the low byte of each 32-bit pixel.
 static_assert(std::endian::native == std::endian::little);
@@ -102,25 +100,6 @@ static_assert(std::endian::native == std::endian::little);
 // Through signed lanes: a byte fits, and SSE2 converts only signed integers.
 inline f32x4 channel(u32x4 pixels, int shift) {
     return __builtin_convertvector(__builtin_convertvector((pixels >> shift) & 0xFFu, i32x4), f32x4);
-}
-
-// v > bound ? v : bound, and v < bound ? v : bound: a NaN lane gives the
-// bound. SSE's max and min have exactly these semantics (second operand on
-// NaN or equality); the compiler does not pick them for a constant bound.
-inline f32x4 max_or_bound(f32x4 v, f32x4 bound) {
-#if defined(__SSE__)
-    return _mm_max_ps(v, bound);
-#else
-    return v > bound ? v : bound;
-#endif
-}
-
-inline f32x4 min_or_bound(f32x4 v, f32x4 bound) {
-#if defined(__SSE__)
-    return _mm_min_ps(v, bound);
-#else
-    return v < bound ? v : bound;
-#endif
 }
 
 // store_rounded for four lanes. Clamping to -0.5..254.5 first is exact

@@ -248,9 +248,9 @@ void run_reference_pass(VorBitmap* bitmap, float amount, std::uint32_t count, st
 // the sum of two, stay within 32 bits).
 
 using vorlite::core::simd::i32x4;
+using vorlite::core::simd::u32x4;
 using vorlite::core::simd::u8x16;
-using u32x4 = std::uint32_t __attribute__((vector_size(16)));
-using u8x4 = vorlite::core::simd::u8x4;
+using vorlite::core::simd::u8x4;
 
 // Two difference weights applied together, as 32-bit two's complement for
 // the generic lanes and packed as 16-bit halves for the multiply-add.
