@@ -5,9 +5,11 @@
 
 #include <cstddef>
 #include <cstdint>
+#include <cstring>
 
 #include "color/color_internal.h"
 #include "core/core_internal.h"
+#include "core/simd.h"
 
 namespace vorlite::color {
 namespace {
@@ -93,6 +95,124 @@ inline void pack_lab(VorColor& c, const Lab& lab) {
     c.r = core::store_truncated(lab.L);
     c.g = core::store_truncated(lab.a);
     c.b = core::store_truncated(lab.b);
+}
+
+// Fast path of the bitmap conversion. Each product in the XYZ sums depends
+// on one channel level only, so the products are tabled per level; the sums
+// are then added in the formula's order and precision. The tables hold the
+// products times 1024: scaling by a power of two is exact and commutes with
+// every rounding of the sum, so the scaled sum is the cube-root index before
+// truncation, both thresholds scale with it exactly, and multiplying back by
+// 1/1024 recovers the ratio itself for the linear segment.
+constexpr double k_index_scale = 1024.0;
+constexpr double k_scaled_epsilon = k_lab_epsilon * k_index_scale;
+constexpr std::ptrdiff_t k_first_bright_index = static_cast<std::ptrdiff_t>(k_scaled_epsilon) + 1;
+
+// Every product table rises with the level and rounding is monotonic, so no
+// sum exceeds white's, which lies a fraction above 1024 (1024.16 for Z: the
+// weights of each row add up to the white point's 1/100). Every ratio of 1
+// or more therefore truncates to index 1024, whose entry is the cap 1.0;
+// the spare entries only widen that margin.
+constexpr int k_top_index = 1024;
+constexpr int k_cbrt_entries = k_top_index + 8;
+
+struct LabFastTables {
+    double x[3][256];  // red, green, blue: scaled products of the level
+    double y[3][256];
+    double z[3][256];
+    double cbrt[k_cbrt_entries];  // widened cube root, 1.0 from index 1024 on
+    std::uint8_t lightness[k_cbrt_entries];  // the packed L* of each entry
+};
+
+// The weights of rgb_to_lab, by channel.
+constexpr double k_weights[3][3] = {{0.00433891, 0.002126, 0.000177255},  // red: X, Y, Z
+                                    {0.00376234915, 0.007152, 0.00109475308},
+                                    {0.0018990604648, 0.000722, 0.0087295537}};
+
+inline double packed_lightness(double fy) { return (116.0 * fy - 16.0) * 2.55; }
+
+LabFastTables build_lab_fast_tables() {
+    LabFastTables t;
+    const float* linear = linear_table().data();
+    const float* cbrt = cbrt_table().data();
+    for (int c = 0; c < 3; ++c) {
+        for (int v = 0; v < 256; ++v) {
+            const double level = linear[v];
+            t.x[c][v] = level * k_weights[c][0] * k_index_scale;
+            t.y[c][v] = level * k_weights[c][1] * k_index_scale;
+            t.z[c][v] = level * k_weights[c][2] * k_index_scale;
+        }
+    }
+    for (int i = 0; i < k_cbrt_entries; ++i) {
+        t.cbrt[i] = i < k_top_index ? static_cast<double>(cbrt[i]) : 1.0;
+        t.lightness[i] = core::store_truncated(packed_lightness(t.cbrt[i]));
+    }
+    return t;
+}
+
+const LabFastTables& lab_fast_tables() {
+    static const LabFastTables tables = build_lab_fast_tables();
+    return tables;
+}
+
+using core::simd::f64x2;
+
+// store_truncated on both lanes, written as two bytes. SSE2 truncates first
+// and then narrows with signed and unsigned saturation: for values within
+// the 32-bit range that clamps to 0..255 exactly as clamping before
+// truncation does (-1 < v < 0 gives 0 either way), and the a* and b* sums
+// stay within -310..565 because every cube root lies in 0.137..1.
+inline void store_truncated2(std::uint8_t* p, f64x2 v) {
+#if defined(__SSE2__)
+    const __m128i truncated = _mm_cvttpd_epi32(v);
+    const __m128i words = _mm_packs_epi32(truncated, truncated);
+    const __m128i bytes = _mm_packus_epi16(words, words);
+    // Through a general register: one move, no word extract.
+    const auto pair = static_cast<std::uint16_t>(_mm_cvtsi128_si32(bytes));
+    std::memcpy(p, &pair, 2);
+#else
+    p[0] = core::store_truncated(v[0]);
+    p[1] = core::store_truncated(v[1]);
+#endif
+}
+
+// Truncation toward zero of a positive scaled ratio, as a pointer-sized
+// integer so that x86-64 needs no sign extension before the lookup.
+inline std::ptrdiff_t cbrt_index(double t) { return static_cast<std::ptrdiff_t>(t); }
+
+inline double lab_compand_scaled(double t, const double* cbrt) {
+    if (t > k_scaled_epsilon) return cbrt[cbrt_index(t)];
+    return lab_linear_segment(t * (1.0 / k_index_scale));
+}
+
+// One RGBA pixel to packed L*a*b*, alpha untouched.
+inline void rgb_to_lab_fast(std::uint8_t* p, const LabFastTables& t) {
+    const int r = p[0], g = p[1], b = p[2];
+    // The formula's order: green's product first, then red's, then blue's.
+    const double x = (t.x[1][g] + t.x[0][r]) + t.x[2][b];
+    const double y = (t.y[1][g] + t.y[0][r]) + t.y[2][b];
+    const double z = (t.z[1][g] + t.z[0][r]) + t.z[2][b];
+    const std::ptrdiff_t ix = cbrt_index(x), iy = cbrt_index(y), iz = cbrt_index(z);
+    double fx, fy, fz;
+    // Photos are mostly brighter than the linear segment. An index of at
+    // least 10 puts its ratio above the threshold (9.07 scaled), so when all
+    // three are, the cube roots come from the table, and so does L*; the
+    // test runs on the integer indices, off the floating-point ports.
+    const std::ptrdiff_t least = (ix - k_first_bright_index) | (iy - k_first_bright_index) |
+                                 (iz - k_first_bright_index);  // negative if any index is below
+    if (least >= 0) [[likely]] {
+        fx = t.cbrt[ix];
+        fy = t.cbrt[iy];
+        fz = t.cbrt[iz];
+        p[0] = t.lightness[iy];
+    } else {
+        fx = lab_compand_scaled(x, t.cbrt);
+        fy = lab_compand_scaled(y, t.cbrt);
+        fz = lab_compand_scaled(z, t.cbrt);
+        p[0] = core::store_truncated(packed_lightness(fy));
+    }
+    // a = 500 (fx - fy) + 127 and b = 200 (fy - fz) + 127, one per lane.
+    store_truncated2(p + 1, f64x2{500.0, 200.0} * (f64x2{fx, fy} - f64x2{fy, fz}) + 127.0);
 }
 
 inline float lab_inverse_compand(float f) {
@@ -302,15 +422,10 @@ VOR_API void VorColorHSL2RGB(const float hsl[3], VorColor* out) {
 }
 
 VOR_API void VorBitmapConvertRGBToLAB(VorBitmap* bitmap) {
-    const float* linear = linear_table().data();
-    const float* cbrt = cbrt_table().data();
+    const LabFastTables& fast = lab_fast_tables();
     std::uint8_t* p = bitmap->data;
     const std::size_t n = vorlite::core::pixel_count(*bitmap);
-    for (std::size_t i = 0; i < n; ++i, p += 4) {
-        VorColor c = vorlite::core::load_pixel(p);
-        pack_lab(c, rgb_to_lab_tabled(c, linear, cbrt));
-        vorlite::core::store_pixel(p, c);
-    }
+    for (std::size_t i = 0; i < n; ++i, p += 4) rgb_to_lab_fast(p, fast);
 }
 
 VOR_API void VorBitmapConvertLABToRBG(VorBitmap* bitmap, float scaleA, float scaleB) {

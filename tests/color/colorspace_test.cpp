@@ -1,7 +1,9 @@
 #include <gtest/gtest.h>
 
+#include <algorithm>
 #include <cstdint>
 #include <cstdlib>
+#include <cstring>
 #include <string>
 #include <vector>
 
@@ -40,6 +42,34 @@ TEST(PackedLab, BitmapRoundTripKeepsGreysCloseAndAlphaExact) {
         const VorColor& c = pixels[v];
         EXPECT_TRUE(std::abs(c.r - v) <= 6 && std::abs(c.g - v) <= 6 && std::abs(c.b - v) <= 6) << v;
         EXPECT_EQ(c.a, 255 - v);
+    }
+}
+
+// The bitmap conversion tables its sums and cube roots; it must store what
+// the per-pixel conversion stores for every colour, dark ones taking the
+// linear segment included. The prime width leaves a ragged last row, and
+// the alpha, varying with position, must come through untouched.
+TEST(PackedLab, BitmapMatchesPerPixelConversionForEveryColour) {
+    const struct {
+        uint32_t width, height;
+    } shapes[] = {{4093, 4100}, {1, 257}, {257, 1}, {3, 5}};
+    for (const auto& shape : shapes) {
+        const uint32_t n = shape.width * shape.height;
+        std::vector<VorColor> pixels(n), expected(n);
+        for (uint32_t i = 0; i < n; ++i) {
+            const uint32_t rgb = (i * 2654435761u) & 0xFFFFFFu;  // odd multiplier: every colour once per 2^24
+            pixels[i] = rgba(rgb & 255, (rgb >> 8) & 255, rgb >> 16, (i * 37 + 42) & 255);
+            expected[i] = pixels[i];
+            VorColorRGB2LAB(&expected[i]);
+        }
+        VorBitmap bitmap{reinterpret_cast<uint8_t*>(pixels.data()), shape.width, shape.height};
+        VorBitmapConvertRGBToLAB(&bitmap);
+        const auto same = [](const VorColor& x, const VorColor& y) { return std::memcmp(&x, &y, 4) == 0; };
+        const auto first = std::mismatch(pixels.begin(), pixels.end(), expected.begin(), same);
+        ASSERT_TRUE(first.first == pixels.end())
+            << shape.width << " x " << shape.height << " at " << (first.first - pixels.begin()) << ": got "
+            << testing::PrintToString(channels(*first.first)) << ", expected "
+            << testing::PrintToString(channels(*first.second));
     }
 }
 
