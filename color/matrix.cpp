@@ -79,6 +79,7 @@ bool fold_operation(yajl_val operation, double strength, VorColorMatrix* matrix)
 
 }  // namespace
 
+#if VORLITE_EXACT_FLOAT_LANES
 // Four pixels at a time, one pixel per lane and one vector per channel.
 // Every lane performs the scalar steps of color_matrix_per_pixel: the same
 // float products and sums in the same order, then store_rounded's rule with
@@ -156,6 +157,7 @@ void transform(VorBitmap* bitmap, const VorColorMatrix& matrix) {
 
 }  // namespace lanes
 }  // namespace
+#endif
 
 bool diagonal_matrix_map(const VorColorMatrix& matrix, VorHistMap* map) {
     const float* m = matrix.m;
@@ -252,7 +254,11 @@ VOR_API void VorColorMatrixContrast(VorColorMatrix* matrix, float c) {
 
 VOR_API void VorBitmapColorMatrixTransform(VorBitmap* bitmap, const VorColorMatrix* matrix) {
     if (transform_diagonal(bitmap, *matrix)) return;
+#if VORLITE_EXACT_FLOAT_LANES
     lanes::transform(bitmap, *matrix);
+#else
+    color_matrix_per_pixel(bitmap, *matrix);
+#endif
 }
 
 VOR_API void VorBitmapColorMatrixTransformAndBlendWithOriginal(VorBitmap* bitmap,

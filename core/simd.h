@@ -13,6 +13,15 @@
 #include <emmintrin.h>
 #endif
 
+// Float lanes perform the scalar IEEE operation everywhere but on 32-bit
+// ARM's NEON, which flushes subnormal floats to zero: float kernels there
+// keep to their scalar form. Integer lanes are exact everywhere.
+#if defined(__arm__) && defined(__ARM_NEON)
+#define VORLITE_EXACT_FLOAT_LANES 0
+#else
+#define VORLITE_EXACT_FLOAT_LANES 1
+#endif
+
 namespace vorlite::core::simd {
 
 using f32x4 = float __attribute__((vector_size(16)));
