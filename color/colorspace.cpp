@@ -423,9 +423,8 @@ VOR_API void VorColorHSL2RGB(const float hsl[3], VorColor* out) {
 
 VOR_API void VorBitmapConvertRGBToLAB(VorBitmap* bitmap) {
     const LabFastTables& fast = lab_fast_tables();
-    std::uint8_t* p = bitmap->data;
-    const std::size_t n = vorlite::core::pixel_count(*bitmap);
-    for (std::size_t i = 0; i < n; ++i, p += 4) rgb_to_lab_fast(p, fast);
+    vorlite::core::for_each_pixel(bitmap->data, vorlite::core::pixel_count(*bitmap),
+                                  [&fast](std::uint8_t* p) { rgb_to_lab_fast(p, fast); });
 }
 
 VOR_API void VorBitmapConvertLABToRBG(VorBitmap* bitmap, float scaleA, float scaleB) {

@@ -52,6 +52,10 @@ void blend_through_pair_table(const VorBitmap& dst, const VorBitmap& src, Common
         std::uint8_t* d = dst.data + static_cast<std::size_t>(y) * dst.width * 4;
         const std::uint8_t* s = src.data + static_cast<std::size_t>(y) * src.width * 4;
         for (std::uint32_t x = 0; x < area.width; ++x, d += 4, s += 4) {
+            if (x % 16 == 0) {
+                core::prefetch_ahead<true>(d);
+                core::prefetch_ahead<false>(s);
+            }
             d[0] = table[(s[0] << 8) | d[0]];
             d[1] = table[(s[1] << 8) | d[1]];
             d[2] = table[(s[2] << 8) | d[2]];
@@ -104,6 +108,10 @@ void blend_weighted_mean(const VorBitmap& dst, const VorBitmap& src, CommonArea 
         const std::uint8_t* s = src.data + static_cast<std::size_t>(y) * src.width * 4;
         std::uint32_t x = 0;
         for (; x + 4 <= area.width; x += 4, d += 16, s += 16) {
+            if (x % 16 == 0) {
+                core::prefetch_ahead<true>(d);
+                core::prefetch_ahead<false>(s);
+            }
             const __m128i below = _mm_loadu_si128(reinterpret_cast<const __m128i*>(d));
             const __m128i over = _mm_loadu_si128(reinterpret_cast<const __m128i*>(s));
             const __m128i low = mean_of_halves(_mm_unpacklo_epi8(over, zero), _mm_unpacklo_epi8(below, zero), w,

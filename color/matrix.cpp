@@ -144,7 +144,10 @@ void transform(VorBitmap* bitmap, const VorColorMatrix& matrix) {
     const std::size_t n = core::pixel_count(*bitmap);
     std::uint8_t* p = bitmap->data;
     std::size_t i = 0;
-    for (; i + 4 <= n; i += 4, p += 16) transform_four(p, k);
+    for (; i + 4 <= n; i += 4, p += 16) {
+        if (i % 16 == 0) core::prefetch_ahead<true>(p);
+        transform_four(p, k);
+    }
     // The last one to three pixels go through the same lanes from a padded
     // copy, so no byte past the bitmap is read or written.
     const std::size_t rest = (n - i) * 4;

@@ -8,6 +8,7 @@
 #include <cstdint>
 #include <cstring>
 #include <limits>
+#include <type_traits>
 
 #include "zentra_vorlite.h"
 
@@ -30,6 +31,31 @@ inline VorColor load_pixel(const std::uint8_t* p) {
 }
 
 inline void store_pixel(std::uint8_t* p, VorColor c) { std::memcpy(p, &c, 4); }
+
+// A pass over a large bitmap waits on memory unless it asks for its bytes
+// ahead: the hardware prefetcher alone leaves a 12-megapixel pass at about
+// half the speed of a copy. A prefetch never faults, so the address may lie
+// past the bitmap; it is formed as an integer for that reason.
+inline constexpr std::size_t k_prefetch_distance = 2048;
+
+template <bool for_writing>
+inline void prefetch_ahead(const void* p) {
+    const auto ahead = reinterpret_cast<std::uintptr_t>(p) + k_prefetch_distance;
+    __builtin_prefetch(reinterpret_cast<const void*>(ahead), for_writing ? 1 : 0);
+}
+
+// Calls visit(p) for each of the n pixels from p, in memory order, asking
+// for the memory ahead once per cache line of 16 pixels.
+template <typename Byte, typename Visit>
+inline void for_each_pixel(Byte* p, std::size_t n, Visit&& visit) {
+    constexpr bool for_writing = !std::is_const_v<Byte>;
+    std::size_t i = 0;
+    for (; i + 16 <= n; i += 16) {
+        prefetch_ahead<for_writing>(p);
+        for (int k = 0; k < 16; ++k, p += 4) visit(p);
+    }
+    for (; i < n; ++i, p += 4) visit(p);
+}
 
 // Truncation toward zero that is defined for every input: NaN gives 0 and
 // values beyond the range of Int saturate instead of being undefined.

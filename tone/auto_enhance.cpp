@@ -70,9 +70,7 @@ Gains gain_table(const VorHistogram& histogram, std::size_t pixels, int mode) {
 constexpr double kGreenShare = 0x1.9999999999998p-3;
 
 void apply_gains(VorBitmap* bitmap, const Gains& gains, const Levels& levels) {
-    std::uint8_t* p = bitmap->data;
-    std::uint8_t* const end = p + vorlite::core::byte_count(*bitmap);
-    for (; p != end; p += 4) {
+    vorlite::core::for_each_pixel(bitmap->data, vorlite::core::pixel_count(*bitmap), [&](std::uint8_t* p) {
         const double r = p[0];
         const double g = p[1];
         const double b = p[2];
@@ -90,7 +88,7 @@ void apply_gains(VorBitmap* bitmap, const Gains& gains, const Levels& levels) {
         p[0] = store_truncated(r_out);
         p[1] = store_truncated(g_out);
         p[2] = store_truncated(b_out);
-    }
+    });
 }
 
 }  // namespace

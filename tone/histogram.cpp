@@ -75,26 +75,23 @@ VOR_API void VorBitmapHistogramTransform(VorBitmap* bitmap, const VorHistMap* ma
     const std::uint8_t* red = map->map[0];
     const std::uint8_t* green = map->map[1];
     const std::uint8_t* blue = map->map[2];
-    std::uint8_t* p = bitmap->data;
-    const std::size_t n = pixel_count(*bitmap);
-    for (std::size_t i = 0; i < n; ++i, p += 4) {
+    vorlite::core::for_each_pixel(bitmap->data, pixel_count(*bitmap), [&](std::uint8_t* p) {
         p[0] = red[p[0]];
         p[1] = green[p[1]];
         p[2] = blue[p[2]];
-    }
+    });
 }
 
 VOR_API void VorHistogramBuild(const VorBitmap* bitmap, VorHistogram* histogram) {
     std::uint32_t* red = histogram->count[0];
     std::uint32_t* green = histogram->count[1];
     std::uint32_t* blue = histogram->count[2];
-    const std::uint8_t* p = bitmap->data;
-    const std::size_t n = pixel_count(*bitmap);
-    for (std::size_t i = 0; i < n; ++i, p += 4) {
+    const std::uint8_t* pixels = bitmap->data;
+    vorlite::core::for_each_pixel(pixels, pixel_count(*bitmap), [&](const std::uint8_t* p) {
         ++red[p[0]];
         ++green[p[1]];
         ++blue[p[2]];
-    }
+    });
 }
 
 VOR_API void VorHistogram2CDFChan(const uint32_t counts[256], double cdf[256]) {

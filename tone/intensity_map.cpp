@@ -75,9 +75,7 @@ void intensity_map_by_table(VorBitmap* bitmap, const VorHistMap& map, std::uint3
     BlendTable table(mode, opacity);
     // Per luminance level, the three result rows of its mapped colour.
     std::array<std::array<const std::uint8_t*, 3>, 256> rows{};
-    std::uint8_t* p = bitmap->data;
-    const std::size_t n = pixel_count(*bitmap);
-    for (std::size_t i = 0; i < n; ++i, p += 4) {
+    vorlite::core::for_each_pixel(bitmap->data, pixel_count(*bitmap), [&](std::uint8_t* p) {
         const std::uint8_t level = luminance_level(p);
         auto& level_rows = rows[level];
         if (level_rows[0] == nullptr) {
@@ -86,7 +84,7 @@ void intensity_map_by_table(VorBitmap* bitmap, const VorHistMap& map, std::uint3
         p[0] = level_rows[0][p[0]];
         p[1] = level_rows[1][p[1]];
         p[2] = level_rows[2][p[2]];
-    }
+    });
 }
 
 void intensity_map_per_pixel(VorBitmap* bitmap, const VorHistMap& map, std::uint32_t mode,

@@ -45,25 +45,21 @@ extern "C" {
 VOR_API void VorBitmapAddNoise(VorBitmap* bitmap, float intensity, uint32_t seed) {
     std::uint32_t state = working_state(seed);
     const float amplitude = intensity * 255.0f;
-    std::uint8_t* p = bitmap->data;
-    std::uint8_t* const end = p + vorlite::core::byte_count(*bitmap);
-    for (; p != end; p += 4) {
+    vorlite::core::for_each_pixel(bitmap->data, vorlite::core::pixel_count(*bitmap), [&](std::uint8_t* p) {
         const int n = grain_offset(&state, amplitude);
         p[0] = add_offset(p[0], n);
         p[1] = add_offset(p[1], n);
         p[2] = add_offset(p[2], n);
         // Grain makes every pixel opaque, whatever its alpha was.
         p[3] = 255;
-    }
+    });
 }
 
 VOR_API void VorBitmapAddChannelIndependentNoise(VorBitmap* bitmap, float intensity,
                                                  uint32_t seed) {
     std::uint32_t state = working_state(seed);
     const float amplitude = intensity * 255.0f;
-    std::uint8_t* p = bitmap->data;
-    std::uint8_t* const end = p + vorlite::core::byte_count(*bitmap);
-    for (; p != end; p += 4) {
+    vorlite::core::for_each_pixel(bitmap->data, vorlite::core::pixel_count(*bitmap), [&](std::uint8_t* p) {
         const int nr = grain_offset(&state, amplitude);
         const int ng = grain_offset(&state, amplitude);
         const int nb = grain_offset(&state, amplitude);
@@ -71,7 +67,7 @@ VOR_API void VorBitmapAddChannelIndependentNoise(VorBitmap* bitmap, float intens
         p[1] = add_offset(p[1], ng);
         p[2] = add_offset(p[2], nb);
         p[3] = 255;
-    }
+    });
 }
 
 VOR_API int VLPLRunNoiseProcessor(const yajl_val parameters, VorBitmap* bitmap,
