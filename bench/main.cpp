@@ -5,6 +5,8 @@
 //                         with exactly five processors that runs is used
 //   --peer-threads=all    run the peers on every core (default: one thread)
 //   --write-photo=PATH    write the 12-megapixel sample as PNG and exit
+//   --evict-caches        push each fresh copy out of the core's own caches
+//                         before timing the library on it
 #include <benchmark/benchmark.h>
 #include <cstdio>
 #include <cstring>
@@ -17,6 +19,7 @@
 
 #include "peers.h"
 #include "photo.h"
+#include "runner.h"
 #include "suite.h"
 
 namespace {
@@ -25,6 +28,7 @@ struct Options {
     std::string photo;
     std::vector<std::string> documents;
     bool all_cores = false;
+    bool evict_caches = false;
     std::string write_photo;
 };
 
@@ -50,6 +54,8 @@ bool parse(int& argc, char** argv, Options& options) {
                 return false;
             }
             options.all_cores = value == "all";
+        } else if (std::strcmp(argv[i], "--evict-caches") == 0) {
+            options.evict_caches = true;
         } else if (take(argv[i], "--write-photo=", value)) {
             options.write_photo = value;
         } else {
@@ -93,6 +99,7 @@ int main(int argc, char** argv) {
         return 1;
     }
     set_peer_threads(options.all_cores);
+    set_evict_private_caches(options.evict_caches);
 
     benchmark::Initialize(&argc, argv);
     if (benchmark::ReportUnrecognizedArguments(argc, argv)) return 2;

@@ -44,6 +44,7 @@ struct Memory {
 struct Inputs {
     Run single;  // every benchmark, peers on one thread
     Run multi;   // the peers again on every core; may be empty
+    Run cold;    // the library again, each copy pushed out of the core's caches; may be empty
     std::string machine;
     std::string date;
     Memory memory;

@@ -1,6 +1,7 @@
 // vorlite_bench_report: writes the results table from the benchmark runs.
 //   --single=FILE        JSON of the run with the peers on one thread (required)
 //   --multi=FILE         JSON of the peers' run on every core
+//   --cold=FILE          JSON of the library's run with --evict-caches
 //   --machine=TEXT       description of the machine
 //   --date=TEXT          when the runs were made
 //   --peak-rss-kb=N      the tool's peak resident memory
@@ -53,9 +54,10 @@ bool load(const std::string& path, vorlite::bench::report::Run& run) {
 
 int main(int argc, char** argv) {
     vorlite::bench::report::Inputs inputs;
-    std::string single, multi, out, peak, bitmap;
+    std::string single, multi, cold, out, peak, bitmap;
     for (int i = 1; i < argc; ++i) {
         if (!take(argv[i], "--single=", single) && !take(argv[i], "--multi=", multi) &&
+            !take(argv[i], "--cold=", cold) &&
             !take(argv[i], "--machine=", inputs.machine) && !take(argv[i], "--date=", inputs.date) &&
             !take(argv[i], "--peak-rss-kb=", peak) && !take(argv[i], "--bitmap-bytes=", bitmap) &&
             !take(argv[i], "--memory-note=", inputs.memory.note) && !take(argv[i], "--out=", out)) {
@@ -67,7 +69,10 @@ int main(int argc, char** argv) {
         std::fprintf(stderr, "vorlite_bench_report: --single=FILE is required\n");
         return 2;
     }
-    if (!load(single, inputs.single) || (!multi.empty() && !load(multi, inputs.multi))) return 1;
+    if (!load(single, inputs.single) || (!multi.empty() && !load(multi, inputs.multi)) ||
+        (!cold.empty() && !load(cold, inputs.cold))) {
+        return 1;
+    }
     if (!peak.empty() && !bitmap.empty()) {
         inputs.memory.measured = true;
         inputs.memory.peak_bytes = std::strtod(peak.c_str(), nullptr) * 1024.0;

@@ -1,6 +1,8 @@
 #include "runner.h"
 
+#include <cstddef>
 #include <utility>
+#include <vector>
 
 namespace vorlite::bench {
 
@@ -27,12 +29,29 @@ void add_benchmark(const std::string& operation, const std::string& side, const 
         size.width == kLarge.width ? 0.3 : 0.2);
 }
 
+namespace {
+
+bool evict_private_caches = false;
+
+// Writing a buffer several times the size of a core's private caches
+// leaves none of the bitmap in them.
+void evict() {
+    static std::vector<unsigned char> sweep(std::size_t{64} << 20);
+    for (std::size_t i = 0; i < sweep.size(); i += 64) ++sweep[i];
+    benchmark::DoNotOptimize(sweep.data());
+}
+
+}  // namespace
+
+void set_evict_private_caches(bool evict) { evict_private_caches = evict; }
+
 void time_in_place(benchmark::State& state, const cv::Mat& source, const std::function<void(cv::Mat&)>& op) {
     cv::Mat work = source.clone();
     op(work);
     for (auto _ : state) {
         state.PauseTiming();
         source.copyTo(work);
+        if (evict_private_caches) evict();
         state.ResumeTiming();
         op(work);
         benchmark::ClobberMemory();

@@ -29,6 +29,11 @@ void add_benchmark(const std::string& operation, const std::string& side, const 
 // timed. For operations that work in place, like every one of the library.
 void time_in_place(benchmark::State& state, const cv::Mat& source, const std::function<void(cv::Mat&)>& op);
 
+// When set, time_in_place pushes the fresh copy out of the core's own
+// caches before timing, so that every size starts from the shared cache or
+// memory, as a photo decoded a while before would.
+void set_evict_private_caches(bool evict);
+
 // Times op as it is: for peers that write into their own output buffer.
 // op returns false when the peer failed, which ends the benchmark with an
 // error rather than a figure.

@@ -3,7 +3,8 @@
 # photo and rewrites bench/RESULTS.md. Installs the peers from Debian when
 # missing (idempotent), builds, runs the harness's own checks,
 # then the benchmarks: every pair with the peers on one thread, the peers
-# again on every core, and the command-line tool's peak memory.
+# again on every core, the library again with each bitmap starting outside
+# the core's caches, and the command-line tool's peak memory.
 #   BENCH_REPETITIONS=N   repetitions per benchmark (default 5)
 #   BENCH_FILTER=REGEX    only the benchmarks whose name matches (quick looks)
 #   BENCH_BUILD=DIR       build directory (default build/bench)
@@ -68,6 +69,12 @@ peer_filter=$filter
 "$build/bench/vorlite_bench" "${common[@]}" --peer-threads=all \
   --benchmark_filter="$peer_filter" --benchmark_out="$build/multi.json"
 
+echo "bench: the library again, each copy first pushed out of the core's caches"
+ours_filter=$filter
+[ "$filter" = . ] && ours_filter='/ours/'
+"$build/bench/vorlite_bench" "${common[@]}" "${documents[@]}" --evict-caches \
+  --benchmark_filter="$ours_filter" --benchmark_out="$build/cold.json"
+
 memory=()
 if [ "$have_tool" -eq 1 ]; then
   echo "bench: the command-line tool's peak memory on a 12-megapixel photo"
@@ -89,6 +96,7 @@ mem_gib=$(awk '/^MemTotal/ { printf "%.0f", $2 / 1048576 }' /proc/meminfo)
 compiler=$(c++ --version | head -n 1)
 machine="$model, $(nproc) cores, $mem_gib GiB, Linux $(uname -r), $compiler, other programs running: load average $(cut -d' ' -f1-3 /proc/loadavg)"
 "$build/bench/vorlite_bench_report" --single="$build/single.json" --multi="$build/multi.json" \
+  --cold="$build/cold.json" \
   --machine="$machine" --date="$(date -u '+%Y-%m-%d %H:%M UTC')" "${memory[@]}" --out="$root/bench/RESULTS.md"
 echo "bench: wrote bench/RESULTS.md"
 cat "$root/bench/RESULTS.md"
