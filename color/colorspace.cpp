@@ -72,19 +72,30 @@ struct Lab {
     double L, a, b;
 };
 
+// sRGB-to-XYZ weights already divided by 100 and by the D65 white, by
+// channel: red, green, blue, each giving its X, Y and Z weight.
+constexpr double k_xyz_weights[3][3] = {{0.00433891, 0.002126, 0.000177255},
+                                        {0.00376234915, 0.007152, 0.00109475308},
+                                        {0.0018990604648, 0.000722, 0.0087295537}};
+enum Channel { kRed, kGreen, kBlue };
+enum Axis { kX, kY, kZ };
+
+// L* scaled to the byte range, before storing.
+inline double packed_lightness(double fy) { return (116.0 * fy - 16.0) * 2.55; }
+
 template <typename CubeRoot>
 inline Lab rgb_to_lab(const VorColor& c, const float* linear, CubeRoot cube_root) {
     const double rl = linear[c.r];
     const double gl = linear[c.g];
     const double bl = linear[c.b];
-    // sRGB-to-XYZ weights already divided by 100 and by the D65 white.
-    const double x = (gl * 0.00376234915 + rl * 0.00433891) + bl * 0.0018990604648;
-    const double y = (gl * 0.007152 + rl * 0.002126) + bl * 0.000722;
-    const double z = (gl * 0.00109475308 + rl * 0.000177255) + bl * 0.0087295537;
+    const auto& w = k_xyz_weights;
+    const double x = (gl * w[kGreen][kX] + rl * w[kRed][kX]) + bl * w[kBlue][kX];
+    const double y = (gl * w[kGreen][kY] + rl * w[kRed][kY]) + bl * w[kBlue][kY];
+    const double z = (gl * w[kGreen][kZ] + rl * w[kRed][kZ]) + bl * w[kBlue][kZ];
     const double fx = cube_root(x);
     const double fy = cube_root(y);
     const double fz = cube_root(z);
-    return Lab{(116.0 * fy - 16.0) * 2.55, 500.0 * (fx - fy) + 127.0, 200.0 * (fy - fz) + 127.0};
+    return Lab{packed_lightness(fy), 500.0 * (fx - fy) + 127.0, 200.0 * (fy - fz) + 127.0};
 }
 
 inline Lab rgb_to_lab_tabled(const VorColor& c, const float* linear, const float* cbrt) {
@@ -124,13 +135,6 @@ struct LabFastTables {
     std::uint8_t lightness[k_cbrt_entries];  // the packed L* of each entry
 };
 
-// The weights of rgb_to_lab, by channel.
-constexpr double k_weights[3][3] = {{0.00433891, 0.002126, 0.000177255},  // red: X, Y, Z
-                                    {0.00376234915, 0.007152, 0.00109475308},
-                                    {0.0018990604648, 0.000722, 0.0087295537}};
-
-inline double packed_lightness(double fy) { return (116.0 * fy - 16.0) * 2.55; }
-
 LabFastTables build_lab_fast_tables() {
     LabFastTables t;
     const float* linear = linear_table().data();
@@ -138,9 +142,9 @@ LabFastTables build_lab_fast_tables() {
     for (int c = 0; c < 3; ++c) {
         for (int v = 0; v < 256; ++v) {
             const double level = linear[v];
-            t.x[c][v] = level * k_weights[c][0] * k_index_scale;
-            t.y[c][v] = level * k_weights[c][1] * k_index_scale;
-            t.z[c][v] = level * k_weights[c][2] * k_index_scale;
+            t.x[c][v] = level * k_xyz_weights[c][kX] * k_index_scale;
+            t.y[c][v] = level * k_xyz_weights[c][kY] * k_index_scale;
+            t.z[c][v] = level * k_xyz_weights[c][kZ] * k_index_scale;
         }
     }
     for (int i = 0; i < k_cbrt_entries; ++i) {
@@ -189,9 +193,9 @@ inline double lab_compand_scaled(double t, const double* cbrt) {
 inline void rgb_to_lab_fast(std::uint8_t* p, const LabFastTables& t) {
     const int r = p[0], g = p[1], b = p[2];
     // The formula's order: green's product first, then red's, then blue's.
-    const double x = (t.x[1][g] + t.x[0][r]) + t.x[2][b];
-    const double y = (t.y[1][g] + t.y[0][r]) + t.y[2][b];
-    const double z = (t.z[1][g] + t.z[0][r]) + t.z[2][b];
+    const double x = (t.x[kGreen][g] + t.x[kRed][r]) + t.x[kBlue][b];
+    const double y = (t.y[kGreen][g] + t.y[kRed][r]) + t.y[kBlue][b];
+    const double z = (t.z[kGreen][g] + t.z[kRed][r]) + t.z[kBlue][b];
     const std::ptrdiff_t ix = cbrt_index(x), iy = cbrt_index(y), iz = cbrt_index(z);
     double fx, fy, fz;
     // Photos are mostly brighter than the linear segment. An index of at

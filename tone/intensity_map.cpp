@@ -3,6 +3,7 @@
 // the pixel with a blend mode; and the "intensityMap" processor.
 #include <array>
 
+#include "color/color_internal.h"
 #include "core/core_internal.h"
 #include "proclist/proclist_internal.h"
 #include "tone/tone_internal.h"
@@ -24,26 +25,10 @@ VorColor mapped_colour(const VorHistMap& map, std::uint8_t level) {
     return VorColor{map.map[0][level], map.map[1][level], map.map[2][level], 255};
 }
 
-// Every mode except colour blends each channel on its own: the result is a
-// function of the source byte and the destination byte alone, the same for
-// red, green and blue.
-bool channels_independent(std::uint32_t mode) {
-    switch (mode) {
-        case VOR_BLEND_NORMAL:
-        case VOR_BLEND_OVERLAY:
-        case VOR_BLEND_SCREEN:
-        case VOR_BLEND_DARKEN:
-        case VOR_BLEND_MULTIPLY:
-        case VOR_BLEND_SOFT_LIGHT:
-            return true;
-        default:
-            return false;
-    }
-}
-
-// result[S][B] of blending source byte S over destination byte B, each row
-// filled with VorColorBlend over the 256 greys when a pixel first needs it,
-// so a photo costs at most 65536 blends instead of one per pixel.
+// result[S][B] of blending source byte S over destination byte B, for any
+// mode but the colour mode (whose channels depend on each other), each row
+// filled when a pixel first needs it, so a photo costs at most 65536 blends
+// instead of one per pixel.
 class BlendTable {
 public:
     BlendTable(std::uint32_t mode, float opacity) : mode_(mode), opacity_(opacity) {}
@@ -52,13 +37,7 @@ public:
         auto& r = rows_[source];
         if (!filled_[source]) {
             filled_[source] = true;
-            const VorColor layer{source, source, source, 255};
-            for (int b = 0; b < 256; ++b) {
-                const auto level = static_cast<std::uint8_t>(b);
-                VorColor base{level, level, level, 255};
-                VorColorBlend(&base, &layer, mode_, opacity_);
-                r[b] = base.r;
-            }
+            vorlite::color::blend_channel_row(mode_, source, opacity_, r.data());
         }
         return r.data();
     }
@@ -127,7 +106,7 @@ extern "C" {
 VOR_API void VorBitmapIntensityMap(VorBitmap* bitmap, const VorHistMap* map, uint32_t mode,
                                    double alpha) {
     const auto opacity = static_cast<float>(alpha);
-    if (channels_independent(mode)) {
+    if (mode != VOR_BLEND_COLOR) {
         intensity_map_by_table(bitmap, *map, mode, opacity);
     } else if (mode == VOR_BLEND_COLOR && opacity >= 0.0f && opacity <= 1.0f) {
         intensity_map_colour(bitmap, *map, opacity);
