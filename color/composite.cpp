@@ -400,16 +400,14 @@ VOR_API int VLPLRunBlendWithColorProcessor(const yajl_val parameters, VorBitmap*
     using vorlite::proclist::member;
     if (parameters == nullptr || !YAJL_IS_OBJECT(parameters)) return 0;
     const yajl_val color_value = member(parameters, "color", yajl_t_object);
-    double alpha = 0.0;
-    if (color_value == nullptr || !vorlite::proclist::member_double(parameters, "alpha", &alpha)) {
+    vorlite::proclist::Layering layering;
+    if (color_value == nullptr || !vorlite::proclist::member_layering(parameters, &layering)) {
         return 0;
     }
     VorColor color;
     if (!VLPLColorFromColorVal(color_value, &color)) return 0;
-    int mode = 0;
-    VLPLBlendModeFromBlendModeVal(member(parameters, "blendMode", yajl_t_any), &mode);
-    const float opacity = static_cast<float>(options->strength * alpha);
-    VorBitmapBlendWithColor(bitmap, &color, static_cast<uint32_t>(mode), opacity);
+    const float opacity = static_cast<float>(options->strength * layering.alpha);
+    VorBitmapBlendWithColor(bitmap, &color, layering.mode, opacity);
     return 1;
 }
 

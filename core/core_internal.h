@@ -92,6 +92,52 @@ constexpr std::uint8_t clamp_byte(int v) {
     return static_cast<std::uint8_t>(v < 0 ? 0 : (v > 255 ? 255 : v));
 }
 
+// Working memory of an operation: a zero-filled bitmap from VorBitmapBuild,
+// released when it goes out of scope, on every path.
+class WorkingBitmap {
+public:
+    WorkingBitmap() = default;
+    WorkingBitmap(const WorkingBitmap&) = delete;
+    WorkingBitmap& operator=(const WorkingBitmap&) = delete;
+    ~WorkingBitmap() { VorBitmapFree(&bitmap_); }
+
+    bool build(std::uint32_t width, std::uint32_t height) {
+        VorBitmapFree(&bitmap_);
+        return VorBitmapBuild(&bitmap_, width, height) != 0;
+    }
+    // A copy of source's pixels at its size.
+    bool build_copy(const VorBitmap& source) {
+        return build(source.width, source.height) && VorBitmapCopy(&bitmap_, &source) != 0;
+    }
+    VorBitmap* get() { return &bitmap_; }
+    const VorBitmap* get() const { return &bitmap_; }
+
+private:
+    VorBitmap bitmap_{nullptr, 0, 0};
+};
+
+// Working memory of an operation: a zero-filled block of T from
+// VorArrayBuild2, overflow-checked, released on every path.
+template <typename T>
+class WorkingArray {
+public:
+    WorkingArray() = default;
+    WorkingArray(const WorkingArray&) = delete;
+    WorkingArray& operator=(const WorkingArray&) = delete;
+    ~WorkingArray() { VorArrayFree(&slot_); }
+
+    // count_a x count_b elements (count_b = 1 for a plain run of count_a).
+    bool build(std::uint32_t count_a, std::uint32_t count_b = 1) {
+        VorArrayFree(&slot_);
+        return VorArrayBuild2(&slot_, count_a, count_b, sizeof(T)) != 0;
+    }
+    T* get() const { return static_cast<T*>(slot_); }
+    T& operator[](std::size_t i) const { return get()[i]; }
+
+private:
+    void* slot_ = nullptr;
+};
+
 }  // namespace vorlite::core
 
 #endif

@@ -4,6 +4,8 @@
 
 #include <yajl/yajl_tree.h>
 
+#include <cstdint>
+
 #include "zentra_vorlite.h"
 
 namespace vorlite::proclist {
@@ -18,6 +20,17 @@ yajl_val member(yajl_val object, const char* key, yajl_type type);
 // integer value (which saturates for numbers with a fraction or exponent).
 bool member_double(yajl_val object, const char* key, double* out);
 bool member_integer(yajl_val object, const char* key, long long* out);
+
+// How an adapter lays its result over the picture: "alpha", a required
+// number read as a double (the opacity before the run's strength), and
+// "blendMode", optional: absent, not a string or an unknown name all mean
+// normal, as VLPLBlendModeFromBlendModeVal rules. False only when "alpha"
+// is missing or not a number.
+struct Layering {
+    double alpha;
+    std::uint32_t mode;
+};
+bool member_layering(yajl_val parameters, Layering* out);
 
 }  // namespace vorlite::proclist
 

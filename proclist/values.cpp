@@ -27,6 +27,15 @@ bool member_integer(yajl_val object, const char* key, long long* out) {
     return true;
 }
 
+bool member_layering(yajl_val parameters, Layering* out) {
+    double alpha = 0.0;
+    if (!member_double(parameters, "alpha", &alpha)) return false;
+    int mode = 0;
+    VLPLBlendModeFromBlendModeVal(member(parameters, "blendMode", yajl_t_any), &mode);
+    *out = Layering{alpha, static_cast<std::uint32_t>(mode)};
+    return true;
+}
+
 }  // namespace vorlite::proclist
 
 using vorlite::proclist::member_integer;

@@ -120,20 +120,14 @@ VOR_API int VLPLRunIntensityMapProcessor(const yajl_val parameters, VorBitmap* b
     using vorlite::proclist::member;
     if (parameters == nullptr || !YAJL_IS_OBJECT(parameters)) return 0;
     const yajl_val json_map = member(parameters, "histMap", yajl_t_object);
-    double alpha = 0.0;
-    if (json_map == nullptr || !vorlite::proclist::member_double(parameters, "alpha", &alpha)) {
-        return 0;
-    }
+    vorlite::proclist::Layering layering;
+    if (json_map == nullptr || !vorlite::proclist::member_layering(parameters, &layering)) return 0;
     VorHistMap map;
     if (!VLPLHistMapfromHistMapVal(json_map, &map)) return 0;
-    int mode = 0;
-    if (!VLPLBlendModeFromBlendModeVal(member(parameters, "blendMode", yajl_t_string), &mode)) {
-        return 0;
-    }
     // The strength both pulls the map toward identity and scales the
     // opacity, so a weak run is weaker than either alone.
     VorHistMapFade(&map, options->strength);
-    VorBitmapIntensityMap(bitmap, &map, static_cast<std::uint32_t>(mode), alpha * options->strength);
+    VorBitmapIntensityMap(bitmap, &map, layering.mode, layering.alpha * options->strength);
     return 1;
 }
 

@@ -9,24 +9,6 @@
 
 namespace {
 
-// A same-size copy of the bitmap's pixels, released on every return.
-class WorkingCopy {
-public:
-    WorkingCopy() = default;
-    WorkingCopy(const WorkingCopy&) = delete;
-    WorkingCopy& operator=(const WorkingCopy&) = delete;
-    ~WorkingCopy() { VorBitmapFree(&copy_); }
-
-    bool make(const VorBitmap& bitmap) {
-        return VorBitmapBuild(&copy_, bitmap.width, bitmap.height) != 0 &&
-               VorBitmapCopy(&copy_, &bitmap) != 0;
-    }
-    VorBitmap* bitmap() { return &copy_; }
-
-private:
-    VorBitmap copy_{nullptr, 0, 0};
-};
-
 // Amount -100 scales to a blur of deviation (width + height) / 400 pixels.
 constexpr float kSoftFocusAmount = -100.0f;
 // The blurred image at half weight plus the original at 0.6: the weights
@@ -68,10 +50,10 @@ VOR_API void VorConvolutionProcessorKipSharpen(VorBitmap* bitmap, float amount) 
 VOR_API void VorConvolutionProcessorSharpenAndBlendWithOriginal(VorBitmap* bitmap, float amount,
                                                                 float alpha, uint32_t mode) {
     if (amount == 0.0f || alpha == 0.0f) return;
-    WorkingCopy sharpened;
-    if (!sharpened.make(*bitmap)) return;
-    VorConvolutionEffectBoxHybridSharpen(sharpened.bitmap(), amount);
-    VorBitmapBlendBitmap(bitmap, sharpened.bitmap(), mode, alpha);
+    vorlite::core::WorkingBitmap sharpened;
+    if (!sharpened.build_copy(*bitmap)) return;
+    VorConvolutionEffectBoxHybridSharpen(sharpened.get(), amount);
+    VorBitmapBlendBitmap(bitmap, sharpened.get(), mode, alpha);
 }
 
 VOR_API int VorConvolutionEffectSoftFocus(VorBitmap* bitmap) {
@@ -86,10 +68,10 @@ VOR_API int VorConvolutionEffectSoftFocus(VorBitmap* bitmap) {
         case vorlite::tone::TwoPasses::unavailable:
             break;
     }
-    WorkingCopy original;
-    if (!original.make(*bitmap)) return 0;
+    vorlite::core::WorkingBitmap original;
+    if (!original.build_copy(*bitmap)) return 0;
     VorConvolutionEffectBoxHybridSharpen(bitmap, kSoftFocusAmount);
-    VorBitmapBlendBitmapSeparate(bitmap, original.bitmap(), kSoftFocusBlurWeight,
+    VorBitmapBlendBitmapSeparate(bitmap, original.get(), kSoftFocusBlurWeight,
                                  kSoftFocusOriginalWeight);
     VorBitmapEndGLEffectIfEnabled(bitmap);
     return 1;
@@ -101,21 +83,15 @@ VOR_API void VorConvolutionAntialiasGL(VorBitmap* bitmap) {
 
 VOR_API int VLPLRunSharpnessProcessor(const yajl_val parameters, VorBitmap* bitmap,
                                       const VLPLRunOptions* options) {
-    namespace proclist = vorlite::proclist;
     double amount = 0.0;
-    double alpha = 0.0;
-    if (!proclist::member_double(parameters, "amount", &amount)) return 0;
-    if (!proclist::member_double(parameters, "alpha", &alpha)) return 0;
-    int mode = 0;
-    if (!VLPLBlendModeFromBlendModeVal(proclist::member(parameters, "blendMode", yajl_t_any),
-                                       &mode)) {
-        return 0;
-    }
+    vorlite::proclist::Layering layering;
+    if (!vorlite::proclist::member_double(parameters, "amount", &amount)) return 0;
+    if (!vorlite::proclist::member_layering(parameters, &layering)) return 0;
     // The run's strength fades the sharpened copy in; the filter itself
     // always runs at the document's amount.
-    const float opacity = static_cast<float>(alpha * options->strength);
+    const float opacity = static_cast<float>(layering.alpha * options->strength);
     VorConvolutionProcessorSharpenAndBlendWithOriginal(bitmap, static_cast<float>(amount), opacity,
-                                                       static_cast<uint32_t>(mode));
+                                                       layering.mode);
     return 1;
 }
 
