@@ -18,6 +18,10 @@ namespace vorlite::core {
 // how a decimal literal happens to round.
 constexpr float float_bits(std::uint32_t bits) { return std::bit_cast<float>(bits); }
 
+// 1/255 as the float nearest 0.003921569: the scale from a channel byte to
+// 0..1 in every single-precision step.
+inline constexpr float k_inv255 = float_bits(0x3B808081u);
+
 constexpr std::size_t pixel_count(const VorBitmap& bitmap) {
     return static_cast<std::size_t>(bitmap.width) * bitmap.height;
 }
