@@ -7,7 +7,7 @@
 namespace {
 
 // A bitmap holds fewer than 0x40000000 pixels, so its byte size fits in 32 bits.
-constexpr std::uint32_t kPixelLimit = 0x40000000u;
+constexpr std::uint32_t k_pixel_limit = 0x40000000u;
 
 }  // namespace
 
@@ -16,7 +16,7 @@ extern "C" {
 VOR_API int VorBitmapBuild(VorBitmap* bitmap, uint32_t width, uint32_t height) {
     bitmap->width = width;
     bitmap->height = height;
-    if (width != 0 && (height > 0xFFFFFFFFu / width || width * height >= kPixelLimit)) {
+    if (width != 0 && (height > 0xFFFFFFFFu / width || width * height >= k_pixel_limit)) {
         bitmap->data = nullptr;
         return 0;
     }

@@ -3,6 +3,7 @@
 #ifndef VORLITE_CORE_INTERNAL_H
 #define VORLITE_CORE_INTERNAL_H
 
+#include <array>
 #include <bit>
 #include <cstddef>
 #include <cstdint>
@@ -95,6 +96,12 @@ constexpr std::uint8_t store_truncated(Real v) {
 constexpr std::uint8_t clamp_byte(int v) {
     return static_cast<std::uint8_t>(v < 0 ? 0 : (v > 255 ? 255 : v));
 }
+
+// Histogram maps: a single 256-level curve written into the red, green and
+// blue tables of a map and applied to the bitmap with
+// VorBitmapHistogramTransform; alpha is kept.
+using Curve = std::array<std::uint8_t, 256>;
+void apply_curve(VorBitmap* bitmap, const Curve& curve);
 
 // Working memory of an operation: a zero-filled bitmap from VorBitmapBuild,
 // released when it goes out of scope, on every path.

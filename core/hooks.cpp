@@ -2,7 +2,6 @@
 // accelerated path: the hooks keep their place in every effect so that one
 // can be added without touching the effects.
 #include "core_internal.h"
-#include "proclist/proclist_internal.h"
 
 extern "C" {
 

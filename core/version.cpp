@@ -1,17 +1,11 @@
-// Versions, effect parameters and the shared constants of the interactive tools.
+// Versions of the library and of the effect-document format, and the
+// shared constants of the interactive tools.
 #include "core_internal.h"
 
 extern "C" {
 
 const float kRadiusMultiplier = 2.0f;
 const int32_t kVorToolMaxTolerance = 99999999;
-
-VOR_API void VorEffectInitParams(VLPLRunOptions* options) {
-    options->seed = 0;
-    options->strength = 1.0;
-    options->bordersEnabled = 1;
-    options->scale = 1.0;
-}
 
 VOR_API void VorLiteVersion(uint32_t out[3]) {
     out[0] = 2;

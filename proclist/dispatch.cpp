@@ -15,7 +15,7 @@ struct Processor {
 
 // VLPLRunAutoColorsFadeMaxProcessor is left out on purpose: hosts call it
 // directly, documents cannot reach it.
-constexpr Processor kProcessors[] = {
+constexpr Processor k_processors[] = {
     {"original", VLPLRunOriginalProcessor},
     {"vignette", VLPLRunVignetteProcessor},
     {"legacyProcessor", VLPLRunLegacyProcessor},
@@ -43,7 +43,7 @@ VOR_API int VLPLRunProcessor(const yajl_val processor, VorBitmap* bitmap,
     const yajl_val parameters = member(processor, "parameters", yajl_t_object);
     if (name == nullptr || parameters == nullptr) return 0;
     const char* wanted = YAJL_GET_STRING(name);
-    for (const Processor& p : kProcessors) {
+    for (const Processor& p : k_processors) {
         if (std::strcmp(wanted, p.name) == 0) return p.run(parameters, bitmap, options);
     }
     return 0;

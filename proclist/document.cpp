@@ -11,7 +11,7 @@ using vorlite::proclist::member;
 // yajl releases its tree recursively, one stack frame per level, so an
 // absurdly nested document could exhaust the stack of whoever unloads it.
 // No effect needs more than a handful of levels.
-constexpr int kMaxNesting = 256;
+constexpr int k_max_nesting = 256;
 
 bool nesting_within_limit(const char* text) {
     int depth = 0;
@@ -27,7 +27,7 @@ bool nesting_within_limit(const char* text) {
         } else if (c == '"') {
             in_string = true;
         } else if (c == '[' || c == '{') {
-            if (++depth > kMaxNesting) return false;
+            if (++depth > k_max_nesting) return false;
         } else if (c == ']' || c == '}') {
             --depth;
         }

@@ -66,12 +66,12 @@ VOR_API int VLPLBlendModeFromBlendModeVal(const yajl_val value, int* mode) {
         const char* name;
         int mode;
     };
-    static constexpr Named kModes[] = {{"normal", 0}, {"overlay", 1}, {"darken", 4},
+    static constexpr Named k_modes[] = {{"normal", 0}, {"overlay", 1}, {"darken", 4},
                                        {"screen", 3}, {"color", 2},   {"multiply", 5}};
     *mode = 0;
     if (value == nullptr || !YAJL_IS_STRING(value)) return 1;
     const char* name = YAJL_GET_STRING(value);
-    for (const Named& m : kModes) {
+    for (const Named& m : k_modes) {
         if (std::strcmp(name, m.name) == 0) {
             *mode = m.mode;
             break;

@@ -6,28 +6,11 @@
 #include "proclist/proclist_internal.h"
 #include "tone/tone_internal.h"
 
-namespace vorlite::tone {
-
-bool gather_channel_statistics(const VorBitmap* bitmap, ChannelStatistics* statistics) {
-    statistics->histogram.reset(static_cast<VorHistogram*>(std::calloc(1, sizeof(VorHistogram))));
-    if (!statistics->histogram) return false;
-    VorHistogramBuild(bitmap, statistics->histogram.get());
-    statistics->cdf.reset(static_cast<VorCDF*>(std::calloc(1, sizeof(VorCDF))));
-    if (!statistics->cdf) {
-        statistics->histogram.reset();
-        return false;
-    }
-    VorHistogram2CDF(statistics->histogram.get(), statistics->cdf.get());
-    return true;
-}
-
-}  // namespace vorlite::tone
-
 namespace {
 
 // Matrix elements of the diagonal (red, green, blue) and of the offsets.
-constexpr int kDiagonal[3] = {0, 5, 10};
-constexpr int kOffset[3] = {3, 7, 11};
+constexpr int k_diagonal[3] = {0, 5, 10};
+constexpr int k_offset[3] = {3, 7, 11};
 
 }  // namespace
 
@@ -44,7 +27,7 @@ VOR_API void VorAutoColorsFadeMaxColor(VorBitmap* bitmap, double fade, const Vor
                                          static_cast<double>(ceiling->g),
                                          static_cast<double>(ceiling->b)};
         for (int c = 0; c < 3; ++c) {
-            const double* cdf = statistics.cdf->cdf[c];
+            const double* cdf = statistics.cdf.get()->cdf[c];
             lo[c] = VorCDFINV(cdf, 0.005) * fade;
             hi[c] = VorCDFINV(cdf, 0.995) * fade + 255.0 * (1.0 - fade);
             top[c] = hi[c] >= ceiling_level[c] ? hi[c] : ceiling_level[c];
@@ -53,7 +36,7 @@ VOR_API void VorAutoColorsFadeMaxColor(VorBitmap* bitmap, double fade, const Vor
 
     VorColorMatrix shift;
     VorColorMatrixSetIdentity(&shift);
-    for (int c = 0; c < 3; ++c) shift.m[kOffset[c]] = static_cast<float>(-lo[c]);
+    for (int c = 0; c < 3; ++c) shift.m[k_offset[c]] = static_cast<float>(-lo[c]);
 
     // hi already holds the unchanged share 255 (1 - fade) and is weighed by
     // (1 - fade) once more. Without a ceiling above hi this is just
@@ -63,7 +46,7 @@ VOR_API void VorAutoColorsFadeMaxColor(VorBitmap* bitmap, double fade, const Vor
     VorColorMatrixSetIdentity(&stretch);
     for (int c = 0; c < 3; ++c) {
         const double span = hi[c] * (1.0 - fade) - lo[c] + top[c] * fade;
-        stretch.m[kDiagonal[c]] = static_cast<float>(255.0 / span);
+        stretch.m[k_diagonal[c]] = static_cast<float>(255.0 / span);
     }
 
     // Both matrices lack cross-channel terms, so each is a byte table per

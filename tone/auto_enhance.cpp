@@ -1,7 +1,7 @@
 // Automatic enhancement: a brightness gain per luminance level, derived
 // from the luminance-weighted cumulative histogram and smoothed, applied to
 // green directly and to red and blue partly multiplicatively and partly
-// through green's change. Also the L*a*b* colour-cast correction.
+// through green's change.
 #include <math.h>
 
 #include <array>
@@ -13,8 +13,8 @@ namespace {
 
 using vorlite::core::store_truncated;
 
-constexpr int kLevels = 256;
-using Gains = std::array<float, kLevels>;
+constexpr int k_levels = 256;
+using Gains = std::array<float, k_levels>;
 
 // Per-channel levels: the black point a_c is subtracted and the result
 // multiplied by scale_c. The percentiles are held at 0 and 1, which makes
@@ -45,7 +45,7 @@ float gain_of_ratio(double ratio, int level, int mode) {
     if (mode == 0) return ::powf(r, 0.8f);
     if (mode == 2) return ratio > 1.0 ? ::powf(r, 0.65f) : 1.0f;
     // The exponent shrinks toward white, so highlights are lifted least.
-    const float shade = 1.0f - static_cast<float>(level) * (1.0f / 255.0f);
+    const float shade = 1.0f - static_cast<float>(level) * vorlite::core::k_inv255;
     return ::powf(r, 0.5f * ::powf(shade, 2.2f));
 }
 
@@ -57,7 +57,7 @@ Gains gain_table(const VorHistogram& histogram, std::size_t pixels, int mode) {
     const std::uint32_t(&count)[3][256] = histogram.count;
     Gains gains;
     double running = 0.0;
-    for (int i = 0; i < kLevels; ++i) {
+    for (int i = 0; i < k_levels; ++i) {
         running += count[0][i] * 0.213 + count[1][i] * 0.715 + count[2][i] * 0.072;
         const double ratio = i > 0 ? running * static_cast<double>(q) / i * 255.0 : 0.0;
         gains[i] = gain_of_ratio(ratio, i, mode);
@@ -67,7 +67,7 @@ Gains gain_table(const VorHistogram& histogram, std::size_t pixels, int mode) {
 
 // 1 - 0.8 in double: the share of green's change that red and blue take
 // over additively.
-constexpr double kGreenShare = 0x1.9999999999998p-3;
+constexpr double k_green_share = 0x1.9999999999998p-3;
 
 void apply_gains(VorBitmap* bitmap, const Gains& gains, const Levels& levels) {
     vorlite::core::for_each_pixel(bitmap->data, vorlite::core::pixel_count(*bitmap), [&](std::uint8_t* p) {
@@ -81,7 +81,7 @@ void apply_gains(VorBitmap* bitmap, const Gains& gains, const Levels& levels) {
         // is stored below.
         const double t = gain * g + 0.5;
         const double k = gain - 1.0;
-        const double w = (t - g) * kGreenShare;
+        const double w = (t - g) * k_green_share;
         const double r_out = levels.scale[0] * ((r * 0.8 * k + r + w) - levels.offset[0]) + 0.5;
         const double g_out = levels.scale[1] * (t - levels.offset[1]) + 0.5;
         const double b_out = levels.scale[2] * ((b * 0.8 * k + b + w) - levels.offset[2]) + 0.5;
@@ -106,42 +106,11 @@ VOR_API void VorAutoEnhance(VorBitmap* bitmap, int mode) {
     {
         vorlite::tone::ChannelStatistics statistics;
         if (!vorlite::tone::gather_channel_statistics(bitmap, &statistics)) return;
-        levels = neutral_levels(*statistics.cdf);
-        gains = gain_table(*statistics.histogram, vorlite::core::pixel_count(*bitmap), mode);
+        levels = neutral_levels(*statistics.cdf.get());
+        gains = gain_table(*statistics.histogram.get(), vorlite::core::pixel_count(*bitmap), mode);
     }
-    VorLineSmooth1D(gains.data(), kLevels, 4);
+    VorLineSmooth1D(gains.data(), k_levels, 4);
     apply_gains(bitmap, gains, levels);
-}
-
-VOR_API void VorLabCorrect(VorBitmap* bitmap) {
-    VorBitmapBeginGLEffectIfEnabled(bitmap);
-    VorBitmapConvertRGBToLAB(bitmap);
-
-    float centre_a = 0.0f;
-    float centre_b = 0.0f;
-    {
-        // A failed allocation leaves the pixels in their packed L*a*b* form.
-        vorlite::tone::ChannelStatistics statistics;
-        if (!vorlite::tone::gather_channel_statistics(bitmap, &statistics)) return;
-        // The middle of the 10th..90th percentile range of a chroma channel
-        // is its cast; 127 is neutral.
-        const auto centre = [&](int channel) {
-            const double* cdf = statistics.cdf->cdf[channel];
-            const float p10 = static_cast<float>(VorCDFINV(cdf, static_cast<double>(0.1f)));
-            const float p90 = static_cast<float>(VorCDFINV(cdf, static_cast<double>(0.9f)));
-            return (p90 + p10) * 0.5f - 127.0f;
-        };
-        centre_a = centre(1);
-        centre_b = centre(2);
-    }
-    // Half of each cast is taken out: the packed chroma byte is scaled so
-    // that a byte of 127 + cast/2 would land on 127.
-    const float half_a = centre_a * 0.5f;
-    const float half_b = centre_b * 0.5f;
-    const float factor_a = 127.0f / (half_a + 127.0f);
-    const float factor_b = 127.0f / (half_b + 127.0f);
-    VorBitmapConvertLABToRBG(bitmap, factor_a, factor_b);
-    VorBitmapEndGLEffectIfEnabled(bitmap);
 }
 
 }  // extern "C"

@@ -78,7 +78,7 @@ void green_gains(const VorHistogram& histogram, std::uint32_t pixels, float gain
             gains[i] = 1.0f;
             continue;
         }
-        const float ratio = share / (static_cast<float>(i) * 0.003921569f);
+        const float ratio = share / (static_cast<float>(i) * vorlite::core::k_inv255);
         gains[i] = ratio > 1.0f ? ::powf(ratio, 0.33f) : 1.0f;
     }
 }
@@ -87,79 +87,32 @@ void green_gains(const VorHistogram& histogram, std::uint32_t pixels, float gain
 
 extern "C" {
 
-VOR_API void VorLineSmooth1D(float* values, uint32_t n, int32_t sigma) {
-    void* slot = nullptr;
-    if (!VorArrayBuild2(&slot, n, 2, sizeof(float))) return;
-    float* const smoothed = static_cast<float*>(slot);
-    float* const weight = smoothed + n;
-    // 2 sigma^2 and -(i - j)^2 are integer products; they wrap as 32-bit
-    // ints would, without the undefined behaviour of signed overflow.
-    const auto s = static_cast<std::uint32_t>(sigma);
-    const float k = 1.0f / static_cast<float>(static_cast<std::int32_t>(2u * s * s));
-    // The weight depends only on the distance |i - j|, so each distinct
-    // exponential is computed once; the sums below use the very same values.
-    for (std::uint32_t d = 0; d < n; ++d) {
-        const auto exponent = static_cast<std::int32_t>(0u - d * d);
-        weight[d] = ::expf(static_cast<float>(exponent) * k);
-    }
-    for (std::uint32_t i = 0; i < n; ++i) {
-        float num = 0.0f;
-        float den = 0.0f;
-        for (std::uint32_t j = 0; j < n; ++j) {
-            const float w = weight[i > j ? i - j : j - i];
-            num += values[j] * w;
-            den += w;
-        }
-        smoothed[i] = num / den;
-    }
-    for (std::uint32_t i = 0; i < n; ++i) values[i] = smoothed[i];
-    VorArrayFree(&slot);
-}
-
 VOR_API void VorBlurHistMap(VorBitmap* bitmap, const VorHistMap* map) {
     const std::uint32_t width = bitmap->width;
     const std::uint32_t height = bitmap->height;
     const int radius = box_radius(width, height);
-    VorBitmap copy{};
-    if (!VorBitmapBuild(&copy, width, height)) return;
-    if (!VorBitmapCopy(&copy, bitmap)) {
-        VorBitmapFree(&copy);
-        return;
-    }
-    VorBitmapHistogramTransform(&copy, map);
-    void* slot = nullptr;
-    if (!VorArrayBuild2(&slot, width, height, 4)) {
-        VorBitmapFree(&copy);
-        return;
-    }
-    auto* const mapped = static_cast<std::uint32_t*>(slot);
-    VorBuildIntegralImageGray(&copy, mapped);
+    vorlite::core::WorkingBitmap copy;
+    if (!copy.build_copy(*bitmap)) return;
+    VorBitmapHistogramTransform(copy.get(), map);
+    vorlite::core::WorkingArray<std::uint32_t> mapped;
+    if (!mapped.build(width, height)) return;
+    VorBuildIntegralImageGray(copy.get(), mapped.get());
     // The mapped pixels are no longer needed: their storage, four bytes a
     // pixel, holds the integral image of the unchanged bitmap.
-    auto* const original = reinterpret_cast<std::uint32_t*>(copy.data);
+    auto* const original = reinterpret_cast<std::uint32_t*>(copy.get()->data);
     VorBuildIntegralImageGray(bitmap, original);
-    if (height >= 1) apply_local_means(bitmap, original, mapped, radius);
-    VorArrayFree(&slot);
-    VorBitmapFree(&copy);
+    if (height >= 1) apply_local_means(bitmap, original, mapped.get(), radius);
 }
 
 VOR_API void VorLocalContrastEnhanceProcessor(VorBitmap* bitmap) {
-    void* histogram_slot = nullptr;
-    void* cdf_slot = nullptr;
-    if (!VorArrayBuild(&histogram_slot, 1, sizeof(VorHistogram)) ||
-        !VorArrayBuild(&cdf_slot, 1, sizeof(VorCDF))) {
-        VorArrayFree(&histogram_slot);
-        return;
-    }
-    auto* const histogram = static_cast<VorHistogram*>(histogram_slot);
     // The distribution is built as part of the analysis but the curve
     // reads the counts alone.
-    VorHistogramBuild(bitmap, histogram);
-    VorHistogram2CDF(histogram, static_cast<VorCDF*>(cdf_slot));
+    vorlite::tone::ChannelStatistics statistics;
+    if (!vorlite::tone::gather_channel_statistics(bitmap, &statistics)) return;
 
     // Green stands in for brightness on purpose.
     float gains[256];
-    green_gains(*histogram, bitmap->width * bitmap->height, gains);
+    green_gains(*statistics.histogram.get(), bitmap->width * bitmap->height, gains);
     VorLineSmooth1D(gains, 256, 15);
     std::uint8_t curve[256];
     for (int i = 0; i < 256; ++i) {
@@ -168,8 +121,6 @@ VOR_API void VorLocalContrastEnhanceProcessor(VorBitmap* bitmap) {
     VorHistMap map;
     VorHistMapSet(&map, curve, curve, curve);
     VorBlurHistMap(bitmap, &map);
-    VorArrayFree(&cdf_slot);
-    VorArrayFree(&histogram_slot);
 }
 
 VOR_API void VorLocalContrastEnhance(VorBitmap* bitmap) {

@@ -5,7 +5,6 @@
 
 #include "core/core_internal.h"
 #include "proclist/proclist_internal.h"
-#include "tone/tone_internal.h"
 
 namespace {
 
@@ -21,11 +20,11 @@ std::uint8_t curve_level(float y) {
 // upper half 127..254 (offset by 127, not 128). The upper half therefore
 // sits one level low and 255 maps to 254, even at contrast 1; this drop is
 // part of the curve's established look and is kept.
-vorlite::tone::Curve contrast_curve(float contrast) {
+vorlite::core::Curve contrast_curve(float contrast) {
     const float c = contrast == 0.0f ? 1e-8f : contrast;
     const float k = 1.0f / c;
     const float s = 1.0f / 127.0f;
-    vorlite::tone::Curve curve;
+    vorlite::core::Curve curve;
     for (int i = 0; i < 256; ++i) {
         float y;
         if (i <= 127) {
@@ -38,9 +37,9 @@ vorlite::tone::Curve contrast_curve(float contrast) {
     return curve;
 }
 
-vorlite::tone::Curve gamma_curve(float gamma) {
+vorlite::core::Curve gamma_curve(float gamma) {
     const float s = 1.0f / 255.0f;
-    vorlite::tone::Curve curve;
+    vorlite::core::Curve curve;
     for (int i = 0; i < 256; ++i) {
         curve[i] = curve_level(::powf(static_cast<float>(i) * s, gamma) * 255.0f + 0.5f);
     }
@@ -62,11 +61,11 @@ bool curve_exponent(yajl_val parameters, const VLPLRunOptions* options, float* o
 extern "C" {
 
 VOR_API void VorBitmapContrastCurve(VorBitmap* bitmap, float contrast) {
-    vorlite::tone::apply_curve(bitmap, contrast_curve(contrast));
+    vorlite::core::apply_curve(bitmap, contrast_curve(contrast));
 }
 
 VOR_API void VorBitmapGamma(VorBitmap* bitmap, float gamma) {
-    vorlite::tone::apply_curve(bitmap, gamma_curve(gamma));
+    vorlite::core::apply_curve(bitmap, gamma_curve(gamma));
 }
 
 VOR_API int VLPLRunContrastProcessor(const yajl_val parameters, VorBitmap* bitmap,

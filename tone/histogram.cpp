@@ -1,6 +1,6 @@
-// Histogram maps (per-channel lookup tables), per-channel histograms, their
-// cumulative distributions and the inverse-CDF lookup, the JSON form of a
-// map and the "histogramMapping" processor that applies one.
+// Per-channel histograms, their cumulative distributions and the
+// inverse-CDF lookup, the JSON form of a histogram map and the
+// "histogramMapping" processor that applies one.
 #include <cstring>
 
 #include "core/core_internal.h"
@@ -11,7 +11,7 @@ namespace {
 
 using vorlite::core::pixel_count;
 
-constexpr int kLevels = 256;
+constexpr int k_levels = 256;
 
 // One element of a map channel in JSON: an integer whose low 32 bits hold
 // a level. yajl flags numbers written with a fraction or an exponent, and
@@ -28,59 +28,16 @@ bool level_from_json(yajl_val element, std::uint8_t* out) {
 
 namespace vorlite::tone {
 
-void apply_curve(VorBitmap* bitmap, const Curve& curve) {
-    VorHistMap map;
-    VorHistMapSet(&map, curve.data(), curve.data(), curve.data());
-    VorBitmapHistogramTransform(bitmap, &map);
+bool gather_channel_statistics(const VorBitmap* bitmap, ChannelStatistics* statistics) {
+    if (!statistics->histogram.build(1) || !statistics->cdf.build(1)) return false;
+    VorHistogramBuild(bitmap, statistics->histogram.get());
+    VorHistogram2CDF(statistics->histogram.get(), statistics->cdf.get());
+    return true;
 }
 
 }  // namespace vorlite::tone
 
 extern "C" {
-
-VOR_API void VorHistMapSetIdentity(VorHistMap* map) {
-    for (auto& table : map->map) {
-        for (int i = 0; i < kLevels; ++i) table[i] = static_cast<std::uint8_t>(i);
-    }
-}
-
-VOR_API void VorHistMapSet(VorHistMap* map, const uint8_t red[256], const uint8_t green[256],
-                           const uint8_t blue[256]) {
-    // memmove: a caller may hand in tables of the map itself.
-    std::memmove(map->map[0], red, kLevels);
-    std::memmove(map->map[1], green, kLevels);
-    std::memmove(map->map[2], blue, kLevels);
-}
-
-VOR_API void VorHistMapMap(VorHistMap* map, const VorHistMap* second) {
-    for (int c = 0; c < 3; ++c) {
-        std::uint8_t* table = map->map[c];
-        const std::uint8_t* then = second->map[c];
-        for (int i = 0; i < kLevels; ++i) table[i] = then[table[i]];
-    }
-}
-
-VOR_API void VorHistMapFade(VorHistMap* map, double amount) {
-    if (amount == 1.0) return;
-    const double keep = 1.0 - amount;
-    for (int i = 0; i < kLevels; ++i) {
-        const double w = i * keep;
-        for (auto& table : map->map) {
-            table[i] = vorlite::core::store_rounded(table[i] * amount + w);
-        }
-    }
-}
-
-VOR_API void VorBitmapHistogramTransform(VorBitmap* bitmap, const VorHistMap* map) {
-    const std::uint8_t* red = map->map[0];
-    const std::uint8_t* green = map->map[1];
-    const std::uint8_t* blue = map->map[2];
-    vorlite::core::for_each_pixel(bitmap->data, pixel_count(*bitmap), [&](std::uint8_t* p) {
-        p[0] = red[p[0]];
-        p[1] = green[p[1]];
-        p[2] = blue[p[2]];
-    });
-}
 
 VOR_API void VorHistogramBuild(const VorBitmap* bitmap, VorHistogram* histogram) {
     std::uint32_t* red = histogram->count[0];
@@ -96,17 +53,17 @@ VOR_API void VorHistogramBuild(const VorBitmap* bitmap, VorHistogram* histogram)
 
 VOR_API void VorHistogram2CDFChan(const uint32_t counts[256], double cdf[256]) {
     std::uint32_t running = 0;  // wraps like the counts themselves
-    for (int i = 0; i < kLevels; ++i) {
+    for (int i = 0; i < k_levels; ++i) {
         running += counts[i];
         cdf[i] = static_cast<double>(running);
     }
     if (running != 0) {
         const double scale = 1.0 / static_cast<double>(running);
-        for (int i = 0; i < kLevels; ++i) cdf[i] *= scale;
+        for (int i = 0; i < k_levels; ++i) cdf[i] *= scale;
     } else {
         // Nothing counted: the distribution of a uniform ramp.
         const double step = 1.0 / 255.0;
-        for (int i = 0; i < kLevels; ++i) cdf[i] = i * step;
+        for (int i = 0; i < k_levels; ++i) cdf[i] = i * step;
     }
 }
 
@@ -118,7 +75,7 @@ VOR_API double VorCDFINV(const double cdf[256], double p) {
     if (p <= 0.0) return 0.0;
     if (p >= 1.0) return 255.0;
     if (p <= cdf[0]) return p / cdf[0];
-    for (int j = 0; j < kLevels - 1; ++j) {
+    for (int j = 0; j < k_levels - 1; ++j) {
         if (cdf[j] < p && cdf[j + 1] >= p) return j + (p - cdf[j]) / (cdf[j + 1] - cdf[j]);
     }
     // A normalised total can land just under 1, leaving p above the last
@@ -135,9 +92,9 @@ VOR_API int VLPLHistMapfromHistMapVal(const yajl_val value, VorHistMap* map) {
     if (blue == nullptr) return 0;
     const yajl_val arrays[3] = {red, green, blue};
     for (const yajl_val array : arrays) {
-        if (YAJL_GET_ARRAY(array)->len != kLevels) return 0;
+        if (YAJL_GET_ARRAY(array)->len != k_levels) return 0;
     }
-    for (int i = 0; i < kLevels; ++i) {
+    for (int i = 0; i < k_levels; ++i) {
         std::uint8_t level[3];
         for (int c = 0; c < 3; ++c) {
             if (!level_from_json(YAJL_GET_ARRAY(arrays[c])->values[i], &level[c])) return 0;

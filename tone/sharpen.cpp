@@ -10,21 +10,21 @@
 namespace {
 
 // Amount -100 scales to a blur of deviation (width + height) / 400 pixels.
-constexpr float kSoftFocusAmount = -100.0f;
+constexpr float k_soft_focus_amount = -100.0f;
 // The blurred image at half weight plus the original at 0.6: the weights
 // add up to 1.1, so the glow also lifts the whole picture slightly.
-constexpr float kSoftFocusBlurWeight = 0.5f;
-constexpr float kSoftFocusOriginalWeight = 0.6f;
+constexpr float k_soft_focus_blur_weight = 0.5f;
+constexpr float k_soft_focus_original_weight = 0.6f;
 // A blur of deviation (width + height) / 8000 pixels: just enough to soften
 // jagged edges.
-constexpr float kAntialiasAmount = -5.0f;
+constexpr float k_antialias_amount = -5.0f;
 
 // The soft-focus mix of one row, the blurred pixels weighted first: row
 // holds the original pixels and receives the result.
 void mix_soft_focus_row(std::uint8_t* row, std::uint8_t* blurred, std::uint32_t width) {
     VorBitmap mixed{blurred, width, 1};
     const VorBitmap original{row, width, 1};
-    VorBitmapBlendBitmapSeparate(&mixed, &original, kSoftFocusBlurWeight, kSoftFocusOriginalWeight);
+    VorBitmapBlendBitmapSeparate(&mixed, &original, k_soft_focus_blur_weight, k_soft_focus_original_weight);
     std::memcpy(row, blurred, std::size_t{4} * width);
 }
 
@@ -59,7 +59,7 @@ VOR_API void VorConvolutionProcessorSharpenAndBlendWithOriginal(VorBitmap* bitma
 VOR_API int VorConvolutionEffectSoftFocus(VorBitmap* bitmap) {
     VorBitmapBeginGLEffectIfEnabled(bitmap);
     // Streamed, the mix needs only the row being finished, not a whole copy.
-    switch (vorlite::tone::box_hybrid_two_passes(bitmap, kSoftFocusAmount, mix_soft_focus_row)) {
+    switch (vorlite::tone::box_hybrid_two_passes(bitmap, k_soft_focus_amount, mix_soft_focus_row)) {
         case vorlite::tone::TwoPasses::done:
             VorBitmapEndGLEffectIfEnabled(bitmap);
             return 1;
@@ -70,15 +70,15 @@ VOR_API int VorConvolutionEffectSoftFocus(VorBitmap* bitmap) {
     }
     vorlite::core::WorkingBitmap original;
     if (!original.build_copy(*bitmap)) return 0;
-    VorConvolutionEffectBoxHybridSharpen(bitmap, kSoftFocusAmount);
-    VorBitmapBlendBitmapSeparate(bitmap, original.get(), kSoftFocusBlurWeight,
-                                 kSoftFocusOriginalWeight);
+    VorConvolutionEffectBoxHybridSharpen(bitmap, k_soft_focus_amount);
+    VorBitmapBlendBitmapSeparate(bitmap, original.get(), k_soft_focus_blur_weight,
+                                 k_soft_focus_original_weight);
     VorBitmapEndGLEffectIfEnabled(bitmap);
     return 1;
 }
 
 VOR_API void VorConvolutionAntialiasGL(VorBitmap* bitmap) {
-    VorConvolutionEffectBoxHybridSharpen(bitmap, kAntialiasAmount);
+    VorConvolutionEffectBoxHybridSharpen(bitmap, k_antialias_amount);
 }
 
 VOR_API int VLPLRunSharpnessProcessor(const yajl_val parameters, VorBitmap* bitmap,

@@ -4,18 +4,11 @@
 
 #include <array>
 #include <cstdint>
-#include <cstdlib>
-#include <memory>
 
+#include "core/core_internal.h"
 #include "zentra_vorlite.h"
 
 namespace vorlite::tone {
-
-// Histograms and histogram maps, tone curves: a single 256-level curve
-// written into the red, green and blue tables of a map and applied to the
-// bitmap with VorBitmapHistogramTransform; alpha is kept.
-using Curve = std::array<std::uint8_t, 256>;
-void apply_curve(VorBitmap* bitmap, const Curve& curve);
 
 // Random numbers: one generator step and the uniform float of a state,
 // inline so that per-pixel grain loops run without a call per draw. They
@@ -69,15 +62,11 @@ enum class TwoPasses { done, unavailable, out_of_memory };
 using FinishRow = void (*)(std::uint8_t* row, std::uint8_t* filtered, std::uint32_t width);
 TwoPasses box_hybrid_two_passes(VorBitmap* bitmap, float amount, FinishRow finish);
 
-// Auto colours and auto enhance: the per-channel histogram of a bitmap and
-// its cumulative distribution, held in zeroed working buffers that are
-// released with the record.
-struct FreeDeleter {
-    void operator()(void* p) const { std::free(p); }
-};
+// Histograms: the per-channel histogram of a bitmap and its cumulative
+// distribution, in working memory released with the record.
 struct ChannelStatistics {
-    std::unique_ptr<VorHistogram, FreeDeleter> histogram;
-    std::unique_ptr<VorCDF, FreeDeleter> cdf;
+    core::WorkingArray<VorHistogram> histogram;
+    core::WorkingArray<VorCDF> cdf;
 };
 // Allocates, then fills the histogram and the CDF of the bitmap; false,
 // with every buffer already allocated released again, when memory runs out.
