@@ -7,6 +7,16 @@
  * Pixels are 4 bytes in memory order red, green, blue, alpha, rows top to
  * bottom with a stride of exactly the width; they are not premultiplied
  * unless a function says so. Every record is passed by pointer.
+ *
+ * Threads: the library creates none and holds no lock. Calls on distinct
+ * bitmaps and records may run on different threads at once; calls that
+ * share a bitmap, a tool record or a blend memo table must not overlap.
+ * A loaded effect document may be run from many threads at once, since
+ * running only reads it. The one process-wide state the library touches
+ * is the C library's lrand48 generator, in VorRNGInit.
+ *
+ * Angles are in radians; a positive angle turns the x axis toward the y
+ * axis, which on a bitmap (y pointing down) is clockwise on screen.
  */
 #ifndef ZENTRA_VORLITE_H
 #define ZENTRA_VORLITE_H
@@ -76,7 +86,9 @@ typedef struct VorTransform {
  * black) pixels. Fails, with data null, when the size overflows or reaches
  * 0x40000000 pixels, or when memory runs out. */
 VOR_API int VorBitmapBuild(VorBitmap* bitmap, uint32_t width, uint32_t height);
-/* Frees the pixels and nulls data; the size stays. Safe to call twice. */
+/* Frees pixels that VorBitmapBuild allocated and nulls data; the size
+ * stays. Safe to call twice. Never pass a bitmap over the caller's own
+ * memory: only VorBitmapBuild's pixels may be released here. */
 VOR_API void VorBitmapFree(VorBitmap* bitmap);
 /* Copies every pixel of src into dst; both must be distinct and equal in size. */
 VOR_API int VorBitmapCopy(VorBitmap* dst, const VorBitmap* src);
@@ -137,6 +149,8 @@ VOR_API void VorTransformSetIdentity(VorTransform* transform);
 /* B = A x B; A and B may be the same record. */
 VOR_API void VorTransformConcat(const VorTransform* A, VorTransform* B);
 /* The Post operations multiply on the left: the newest applies last. */
+/* Rotation by angle radians, positive from the x axis toward the y axis
+ * (clockwise on a bitmap, whose y axis points down), about the origin. */
 VOR_API void VorTransformPostRotate(VorTransform* transform, double angle);
 VOR_API void VorTransformPostTranslate(VorTransform* transform, double dx, double dy);
 VOR_API void VorTransformPostScale(VorTransform* transform, double sx, double sy);
@@ -153,7 +167,11 @@ VOR_API void VorTransformGetInverse(const VorTransform* transform, VorTransform*
 typedef struct VLPLEffectDocument VLPLEffectDocument;
 
 /* Parses an effect document; null when the text is null, not JSON, or
- * lacks the "identifier" string or the "processors" array. */
+ * lacks the "identifier" string or the "processors" array. A document that
+ * parses but lacks that envelope is not released: its parsed tree stays
+ * allocated for the life of the process, so a host that loads untrusted
+ * text many times should check it first. Processor names and parameters
+ * are judged only when the document runs. */
 VOR_API VLPLEffectDocument* VLPLLoadEffect(const char* json);
 /* Releases the document and nulls the caller's handle. */
 VOR_API void VLPLUnloadEffect(VLPLEffectDocument** document);
@@ -173,31 +191,60 @@ VOR_API int VLPLBlendModeFromBlendModeVal(const yajl_val value, int* mode);
 /* (1 - strength) * identity + strength * value, in single precision. */
 VOR_API float VLPLBlendAroundIdentity(float value, float identity, float strength);
 
-/* Processor adapters: (parameters object, bitmap, run options) -> 1 or 0. */
+/* Processor adapters: (parameters object, bitmap, run options) -> 1 or 0.
+ * Each is named after the "name" that dispatches to it; its parameter keys
+ * are listed beside it. A required key missing or of the wrong JSON type
+ * gives 0 before any pixel changes. "alpha" is always a number and
+ * "blendMode" an optional blend-mode string (absent means normal). */
+/* "original": no keys; the pixels stay as they are. */
 VOR_API int VLPLRunOriginalProcessor(const yajl_val parameters, VorBitmap* bitmap,
                                      const VLPLRunOptions* options);
+/* "vignette": "color" (colour), "shape" (object), "blendMode". Not in this
+ * build yet: returns 0. */
 VOR_API int VLPLRunVignetteProcessor(const yajl_val parameters, VorBitmap* bitmap,
                                      const VLPLRunOptions* options);
+/* "legacyProcessor": the named legacy effects. Not in this build yet:
+ * returns 0. */
 VOR_API int VLPLRunLegacyProcessor(const yajl_val parameters, VorBitmap* bitmap,
                                    const VLPLRunOptions* options);
+/* "histogramMapping": "histMap" {"r", "g", "b": 256 levels each}, faded
+ * toward the identity by the strength. */
 VOR_API int VLPLRunHistogramMappingProcessor(const yajl_val parameters, VorBitmap* bitmap,
                                              const VLPLRunOptions* options);
+/* "gamma": "value" (number), the exponent, pulled toward 1 by the strength. */
 VOR_API int VLPLRunGammaProcessor(const yajl_val parameters, VorBitmap* bitmap,
                                   const VLPLRunOptions* options);
+/* "colorMatrixTransform": "operations", an array of {"operation":
+ * "brightness" | "contrast" | "saturation", "value": number} or
+ * {"operation": "hardSet", "entries": 12 numbers, "gain": number (optional,
+ * 1)}, folded in order into a matrix that starts as the identity; the
+ * strength pulls each amount toward its identity. */
 VOR_API int VLPLRunColorMatrixTransformProcessor(const yajl_val parameters, VorBitmap* bitmap,
                                                  const VLPLRunOptions* options);
+/* "intensityMap": "histMap" (as "histogramMapping"), "alpha", "blendMode";
+ * the strength fades the map and scales alpha. */
 VOR_API int VLPLRunIntensityMapProcessor(const yajl_val parameters, VorBitmap* bitmap,
                                          const VLPLRunOptions* options);
+/* "flare": a light flare. Not in this build yet: returns 0. */
 VOR_API int VLPLRunFlareProcessor(const yajl_val parameters, VorBitmap* bitmap,
                                   const VLPLRunOptions* options);
+/* "contrast": "value" (number), the S-curve exponent, pulled toward 1 by
+ * the strength. */
 VOR_API int VLPLRunContrastProcessor(const yajl_val parameters, VorBitmap* bitmap,
                                      const VLPLRunOptions* options);
+/* "blendWithColor": "color" (colour), "alpha", "blendMode"; opacity alpha x
+ * strength. */
 VOR_API int VLPLRunBlendWithColorProcessor(const yajl_val parameters, VorBitmap* bitmap,
                                            const VLPLRunOptions* options);
+/* "noise": "intensity" (number) x strength, monochrome grain seeded with
+ * the run's seed. */
 VOR_API int VLPLRunNoiseProcessor(const yajl_val parameters, VorBitmap* bitmap,
                                   const VLPLRunOptions* options);
+/* "sharpness": "amount" (number, the box-hybrid amount), "alpha",
+ * "blendMode"; the sharpened copy is laid over at alpha x strength. */
 VOR_API int VLPLRunSharpnessProcessor(const yajl_val parameters, VorBitmap* bitmap,
                                       const VLPLRunOptions* options);
+/* "gradient": a colour gradient. Not in this build yet: returns 0. */
 VOR_API int VLPLRunGradientProcessor(const yajl_val parameters, VorBitmap* bitmap,
                                      const VLPLRunOptions* options);
 
@@ -566,7 +613,9 @@ typedef struct VorRNG {
 
 /* seed = state = the given value. */
 VOR_API void VorRNGSeed(VorRNG* rng, uint32_t seed);
-/* Seeds from the C library's lrand48 (the one non-reproducible entry). */
+/* Seeds from the C library's lrand48 (the one non-reproducible entry). It
+ * advances lrand48's process-wide state, which other code of the process
+ * may share; no effect of the library calls it. */
 VOR_API void VorRNGInit(VorRNG* rng);
 /* One step; returns the new state. */
 VOR_API uint32_t VorRNGNextInt(VorRNG* rng);
