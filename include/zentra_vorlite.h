@@ -651,6 +651,269 @@ VOR_API void VorAutoEnhance(VorBitmap* bitmap, int mode);
  * converts back to sRGB (levels may shift by the round trip). Alpha kept. */
 VOR_API void VorLabCorrect(VorBitmap* bitmap);
 
+/* ====================================================================== */
+/* Fractal textures                                                       */
+/* ====================================================================== */
+
+/* Noise per midpoint of a fractal profile: uniform in -0.5..0.5, standard
+ * normal or standard Laplace; any other mode draws nothing and the profile
+ * is a plain interpolation of its ends. */
+enum {
+    VOR_MPD_UNIFORM = 0,
+    VOR_MPD_NORMAL = 1,
+    VOR_MPD_LAPLACE = 2
+};
+
+/* Midpoint displacement of profile[first..last] between the two end values
+ * the caller set, amplitude shrinking by 2^-roughness per level, then
+ * stretched over the whole range when last - first is not a power of two
+ * (the stretch assumes first = 0). Random source: a generator seeded with
+ * seed. */
+VOR_API void VorMPDSeed(float* profile, int32_t first, int32_t last, float amplitude,
+                        float roughness, int32_t mode, uint32_t seed);
+/* The same, drawing from the caller's generator and advancing it. */
+VOR_API void VorMPDRNG(float* profile, int32_t first, int32_t last, float amplitude,
+                       float roughness, int32_t mode, VorRNG* rng);
+/* The same, from a generator seeded by VorRNGInit (not reproducible). */
+VOR_API void VorMPD(float* profile, int32_t first, int32_t last, float amplitude,
+                    float roughness, int32_t mode);
+/* Grey diamond-square texture in the top-left (P + 1) x (P + 1) square, P
+ * the largest power of two below the smaller side, with edgeA as columns 0
+ * and P and edgeB as rows 0 and P (each at least P + 1 floats, overwritten).
+ * Seeded with 1234: the texture depends on size, amplitude and roughness
+ * alone. Red, green, blue written; alpha kept; pixels beyond the square
+ * untouched. */
+VOR_API void VorBitmapDiamondSquare(VorBitmap* bitmap, float amplitude, float roughness,
+                                    float* edgeA, float* edgeB);
+
+/* ====================================================================== */
+/* Borders and vignette                                                   */
+/* ====================================================================== */
+
+/* Border styles (VorBorderParams.style), with their document keywords. */
+typedef int32_t VorBorderStyle;
+enum {
+    VOR_BORDER_NONE = 0,
+    VOR_BORDER_HALFTONE = 1,   /* "halftone" */
+    VOR_BORDER_LINES = 2,      /* "lines" */
+    VOR_BORDER_SMOOTH = 3,     /* "smooth" */
+    VOR_BORDER_SHADOW = 4,     /* "shadow" */
+    VOR_BORDER_FADE = 5,       /* "fade" */
+    VOR_BORDER_ROUGH = 6,      /* "rough" */
+    VOR_BORDER_BULGE = 7,      /* "bulge" */
+    VOR_BORDER_TORN = 8,       /* "torn" */
+    VOR_BORDER_TORN_2 = 9,     /* "torn_2" */
+    VOR_BORDER_RECT = 10,      /* "rect" */
+    VOR_BORDER_ROUND = 11,     /* "round" */
+    VOR_BORDER_GLIMMO = 12,    /* "glimmo" */
+    VOR_BORDER_HARD_RAND = 13, /* "hard_rand" */
+    VOR_BORDER_INSTANT = 14,   /* "instant": VorBorders draws nothing */
+    VOR_BORDER_VIGNETTE = 15,  /* "vignette" */
+    VOR_BORDER_VIEWFINDER = 16 /* "viewfinder" */
+};
+
+/* Vignette falloff sharpness (VorBorderParams.shapeMode). */
+typedef int32_t VorBorderShapeMode;
+enum {
+    VOR_SHAPE_NORMAL = 0,        /* "normal" */
+    VOR_SHAPE_SHARP = 1,         /* "sharp" */
+    VOR_SHAPE_MEDIUM_SHARP = 2,  /* "mediumSharp" */
+    VOR_SHAPE_ULTRA_SHARP = 3    /* "ultraSharp" */
+};
+
+/* One record describes every border and the vignette. VorBorderInitParams
+ * sets the defaults noted; sideTune0 and the four profile pointers are left
+ * as they were. Widths scale with width + height of the bitmap. */
+typedef struct VorBorderParams {
+    double inset;          /* 0.0: inset factor or pixels, by style */
+    double halftoneScale;  /* 1.0: halftone frequency divisor (0 ignored) */
+    double lineSpacing;    /* 1.0: line phase divisor */
+    double shadowAngle;    /* 0.0: shadow direction, degrees */
+    double sideTune0;      /* not set: side styles */
+    double sideTune1;      /* 0.0: side styles */
+    double width;          /* 1.0: border width multiplier */
+    double sideTune2;      /* 0.5 */
+    double sideTune3;      /* 1.0 */
+    double sideTune4;      /* 0.28 */
+    double cornerFactor;   /* 2.222: fade corner radius multiplier */
+    double sideTune5;      /* 1.5 */
+    double sideTune6;      /* 1.0 */
+    double sideTune7;      /* 1.0 */
+    double sideTune8;      /* 1.0 */
+    double sideTune9;      /* 1.0 */
+    int32_t mpdMode;       /* 0: noise mode of the edge profiles */
+    int32_t sideFlags;     /* 0: side styles */
+    double vignetteScale;  /* 1.0: vignette radius, pixels (or fraction with stretch) */
+    double falloffPower;   /* 1.0: hard_rand falloff exponent / 4 */
+    double cornerOffset;   /* 0.0: hard_rand pinned profile ends */
+    double roughAmplitude; /* 1.0: hard_rand profile amplitude factor */
+    double opacity;        /* 1.0: hard_rand opacity */
+    double insetLeft;      /* 0.0 each: per-side insets in pixels; styles 1 to 6 */
+    double insetRight;     /*   overwrite all four when they draw */
+    double insetTop;
+    double insetBottom;
+    uint32_t seed;         /* 0: seed of the style's generator */
+    VorColor color;        /* opaque white */
+    int32_t blendMode;     /* 0: blend mode of the colour (styles 9 to 15) */
+    VorBorderStyle style;  /* 0: nothing drawn */
+    float* bottomProfile;  /* not set: caller-owned edge profiles, one float */
+    float* leftProfile;    /*   per column (top, bottom) or row (left, right) */
+    float* rightProfile;
+    float* topProfile;
+    VorBorderShapeMode shapeMode; /* 0: vignette falloff */
+    uint8_t stretch;       /* 0: 1 normalises x and y by the bitmap's size */
+    double dx;             /* 0.0 each: vignette centre offset, fraction of */
+    double dy;             /*   half the width and half the height */
+} VorBorderParams;
+
+/* Writes the defaults above. */
+VOR_API void VorBorderInitParams(VorBorderParams* params);
+/* Draws params->style: 1 to 6 and 16 by VorBordersTheta (which writes the
+ * per-side insets back), 7, 8, 10, 11, 12 by VorBordersSide, 9 by
+ * VorBordersDoubleSided, 13 by VorBordersHardRand, 15 by VorVignette; any
+ * other style leaves the bitmap untouched. */
+VOR_API void VorBorders(VorBitmap* bitmap, VorBorderParams* params);
+/* Band along the four edges with rounded corners, shaded per style; colour
+ * channels mixed inside the band, all four bytes replaced by the colour
+ * outside the frame. Styles 1 to 6 store the computed inset in the four
+ * per-side insets. */
+VOR_API void VorBordersTheta(VorBitmap* bitmap, VorBorderParams* params);
+/* Edge treatments built on fractal edge profiles (the profiles the style
+ * needs must hold one float per column or row): bulge, torn, rect, round
+ * and glimmo. Colour laid over with blendMode; alpha kept. */
+VOR_API void VorBordersSide(VorBitmap* bitmap, const VorBorderParams* params);
+/* Torn edges on two opposite sides at once (torn_2); alpha kept. */
+VOR_API void VorBordersDoubleSided(VorBitmap* bitmap, const VorBorderParams* params);
+/* Theta-like band whose edges are displaced by four fractal profiles,
+ * which it fills (all four must be set); alpha kept. */
+VOR_API void VorBordersHardRand(VorBitmap* bitmap, const VorBorderParams* params);
+/* The instant-print frame; VorBorders never calls it. */
+VOR_API void VorBordersInstant(VorBitmap* bitmap, const VorBorderParams* params);
+/* Darkens (or tints) toward the edges with the colour and blend mode: a
+ * smooth ramp out from the centre (offset by dx, dy) and the full colour
+ * beyond vignetteScale, the ramp's sharpness set by shapeMode; alpha kept. */
+VOR_API void VorVignette(VorBitmap* bitmap, const VorBorderParams* params);
+/* Decoders: a style keyword (0 for a null, non-string or unknown node, the
+ * style then untouched), a shape-mode keyword (always 1; anything else is
+ * "normal"), and the "shape" object of the vignette and gradient
+ * processors: {"vignetteScale": number, "scaling": "average" | "max" |
+ * "stretch", "shapeMode": keyword, "dx": number, "dy": number}, the radius
+ * divided by strength (plus 1e-8 when addEpsilon is set). */
+VOR_API int VLPLBorderStyleFromBorderStyleTypeVal(const yajl_val value, VorBorderStyle* outStyle);
+VOR_API int VLPLBorderShapeModeFromBorderShapeModeVal(const yajl_val value,
+                                                      VorBorderShapeMode* outMode);
+VOR_API int VLPLBorderPopoulateWithShapeTypeVal(const yajl_val shape, VorBorderParams* params,
+                                                const VorBitmap* bitmap, float strength,
+                                                uint8_t addEpsilon);
+
+/* ====================================================================== */
+/* Gradients                                                              */
+/* ====================================================================== */
+
+/* Stops at locations in percent, 0 to 100, in ascending order. */
+typedef struct VorGradientColorStop {
+    VorColor color;
+    double location;
+} VorGradientColorStop;
+
+typedef struct VorGradientOpacityStop {
+    double opacity; /* 0 to 1 */
+    double location;
+} VorGradientOpacityStop;
+
+/* A gradient owns its two stop arrays (VorGradientBuild, VorGradientFree).
+ * Drawing needs at least two colour stops and as many colour stops as
+ * opacity stops: the opacity ramp is measured on the colour stops'
+ * locations. */
+typedef struct VorGradient {
+    VorGradientColorStop* colorStops;
+    VorGradientOpacityStop* opacityStops;
+    uint32_t colorStopCount;
+    uint32_t opacityStopCount;
+} VorGradient;
+
+/* Gradient shapes. */
+enum {
+    VOR_GRADIENT_LINEAR = 0,         /* "linear" */
+    VOR_GRADIENT_RADIAL = 1,         /* "radial" */
+    VOR_GRADIENT_LINEAR_VIGNETTE = 2 /* "linearVignette" */
+};
+
+typedef struct VorGradientShapeParams {
+    int32_t shape;                /* 0 */
+    double scale;                 /* 1.0: length, fraction of the size; 0 draws nothing */
+    double xCenter;               /* 0.5: origin, fraction of the width */
+    double yCenter;               /* 0.5: origin, fraction of the height */
+    double angle;                 /* 0.0: radians */
+    VorBorderShapeMode shapeMode; /* 0: vignette falloff (shape 2) */
+    double vignetteScale;         /* 1.0 */
+    double dx;                    /* 0.0 each: vignette centre offset */
+    double dy;
+} VorGradientShapeParams;
+
+/* Stores both counts and allocates zero-filled stops; 0, with both pointers
+ * null, when a count reaches 2^28 or memory runs out. */
+VOR_API int VorGradientBuild(VorGradient* gradient, uint32_t colorStopCount,
+                             uint32_t opacityStopCount);
+/* Frees both stop arrays and nulls the pointers; the counts stay. */
+VOR_API void VorGradientFree(VorGradient* gradient);
+/* Writes the defaults above. */
+VOR_API void VorGradientShapeParamsInit(VorGradientShapeParams* params);
+/* Samples the gradient into n entries (colour in bytes 0 to 2, opacity in
+ * byte 3), eased between stops; n must be 0 or at least 2. */
+VOR_API void VorGradientMemoize(const VorGradient* gradient, VorColor* table, uint32_t n);
+/* Lays the gradient over the bitmap with the blend mode, each pixel at
+ * opacity x its sampled opacity; alpha kept. */
+VOR_API void VorGradientApply(VorBitmap* bitmap, const VorGradientShapeParams* params,
+                              const VorGradient* gradient, uint32_t blendMode, double opacity);
+/* Fills a built gradient from [{"color": colour, "location": number}, ...]
+ * and [{"opacity": number, "location": number}, ...]; 0 at the first
+ * malformed element, the stops before it written. */
+VOR_API int VLPLGradientfromColorsValAndOpacitiesVal(const yajl_val colors,
+                                                     const yajl_val opacities,
+                                                     VorGradient* gradient);
+
+/* ====================================================================== */
+/* Flares                                                                 */
+/* ====================================================================== */
+
+/* Flare shapes, with their document keywords ("dimondFlare" is spelt so). */
+typedef int32_t VorFlareType;
+enum {
+    VOR_FLARE_SINC = 0,             /* "sinc" */
+    VOR_FLARE_GAUSSIAN_THING = 1,   /* "gaussianThing" */
+    VOR_FLARE_GAUSSIAN_THING_2 = 2, /* "gaussianThing2" */
+    VOR_FLARE_GAUSSIAN_THING_3 = 3, /* "gaussianThing3" */
+    VOR_FLARE_GAUSSIAN_THING_4 = 4, /* "gaussianThing4" */
+    VOR_FLARE_ANGLE_GAUSSIAN = 5,   /* "angleGaussian" */
+    VOR_FLARE_STARDOM = 6,          /* "stardom" */
+    VOR_FLARE_LOBES = 7,            /* "lobes" */
+    VOR_FLARE_NONE = 8,             /* no keyword; draws nothing visible */
+    VOR_FLARE_STRIPE = 9,           /* "stripe" */
+    VOR_FLARE_STRIPE_2 = 10,        /* "stripe2" */
+    VOR_FLARE_DIAMOND = 11,         /* "dimondFlare" */
+    VOR_FLARE_CROSS = 12,           /* "crossFlare" */
+    VOR_FLARE_CORNERS = 13,         /* "cornerFlares" */
+    VOR_FLARE_FINGER = 14,          /* "fingerFlare" */
+    VOR_FLARE_BLOB_FLARE = 15,      /* "blobFlare" */
+    VOR_FLARE_BLAH = 16,            /* "blah" */
+    VOR_FLARE_BLOB = 17,            /* "blob" */
+    VOR_FLARE_BLOB_2 = 18           /* "blob2" */
+};
+
+/* Paints a flare of the colour through the blend mode, centred at (dx, dy)
+ * in fractions of the half-size from the middle, sized dsx x dsy x fScale;
+ * only the type's work box is visited. Nothing when the colour's alpha,
+ * dsx, dsy or fScale is 0. Alpha kept. */
+VOR_API void VorFlare(VorBitmap* bitmap, float fScale, const VorColor* color, VorFlareType type,
+                      float dx, float dy, float dsx, float dsy, uint32_t blendMode);
+/* A flare keyword to its type; 0 for a null, non-string or unknown node. */
+VOR_API int VLPLFlareTypeFromFlareTypeVal(const yajl_val value, VorFlareType* outType);
+/* The preset flares of the legacy catalogue; the seed and strength of the
+ * options place and weigh them. Alpha kept. */
+VOR_API void VorFlareLegacyCorvale(VorBitmap* bitmap, const VLPLRunOptions* options);
+VOR_API void VorFlareLegacyEmberly(VorBitmap* bitmap, const VLPLRunOptions* options);
+
 #ifdef __cplusplus
 }
 #endif
