@@ -103,6 +103,18 @@ constexpr std::uint8_t clamp_byte(int v) {
 using Curve = std::array<std::uint8_t, 256>;
 void apply_curve(VorBitmap* bitmap, const Curve& curve);
 
+// Double-precision elementary functions. They return the same bits on every
+// target (the C libraries' own differ in the last bit between x86-64 with
+// and without fused multiply-add and between C libraries); an exact path
+// calls these rather than <math.h>'s. Special values as in C99 Annex F;
+// errno is never set.
+double exp(double x);
+double log(double x);
+double pow(double x, double y);
+double sin(double x);
+double cos(double x);
+double atan2(double y, double x);
+
 // Working memory of an operation: a zero-filled bitmap from VorBitmapBuild,
 // released when it goes out of scope, on every path.
 class WorkingBitmap {
