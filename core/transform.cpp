@@ -1,7 +1,5 @@
 // Affine transforms in double precision. Every Post operation multiplies on
 // the left, so the newest operation is applied to a point last.
-#include <cmath>
-
 #include "core_internal.h"
 
 extern "C" {
@@ -26,8 +24,8 @@ VOR_API void VorTransformConcat(const VorTransform* A, VorTransform* B) {
 }
 
 VOR_API void VorTransformPostRotate(VorTransform* transform, double angle) {
-    const double c = ::cos(angle);
-    const double s = ::sin(angle);
+    const double c = vorlite::core::cos(angle);
+    const double s = vorlite::core::sin(angle);
     const VorTransform rotation = {c, -s, 0.0, s, c, 0.0};
     VorTransformConcat(&rotation, transform);
 }

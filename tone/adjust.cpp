@@ -1,8 +1,6 @@
 // The editor's slider adjustments: one value, nominally -100..100 with 0
 // meaning no change, turned into a tone curve, a colour matrix, per-channel
 // gains or a sharpening amount and applied to the whole bitmap in place.
-#include <math.h>
-
 #include "core/core_internal.h"
 
 namespace {
@@ -33,7 +31,7 @@ WarmthGains warmth_gains(double value) {
     if (value != 0.0) {
         // 1 - cos over a quarter turn: gentle around 0, reaching 100 at the
         // slider's ends; the sign follows the slider.
-        w = (1.0 - ::cos(value * 0.015707963267948967)) * (value > 0.0 ? 100.0 : -100.0);
+        w = (1.0 - vorlite::core::cos(value * 0.015707963267948967)) * (value > 0.0 ? 100.0 : -100.0);
     }
     const double inverse_white = 0.00392156862745098;
     if (w > 0.0) {
@@ -55,7 +53,7 @@ VOR_API void VorToolBrightness(VorBitmap* bitmap, const void* /*params*/, double
         // Darkening bends the curve instead of scaling: gamma = -log2(0.5 +
         // v / 400), from 1 just below 0 to 2 at -100, so shadows go first
         // and white stays white.
-        const double gamma = ::log(v * 0.0025 + 0.5) * -1.4426950408889634;
+        const double gamma = vorlite::core::log(v * 0.0025 + 0.5) * -1.4426950408889634;
         VorBitmapGamma(bitmap, static_cast<float>(gamma));
     } else {
         apply_matrix(bitmap, VorColorMatrixBrightness, static_cast<float>(1.0 + v * 0.006));
@@ -67,7 +65,7 @@ VOR_API void VorToolContrast(VorBitmap* bitmap, const void* /*params*/, double v
     VorBitmapBeginGLEffectIfEnabled(bitmap);
     // 3.1 raised to v / 100. Even 0 goes through the curve, which lowers
     // the upper half by one level.
-    const double exponent = ::exp(clamp_slider(value) * 0.011314021114911007);
+    const double exponent = vorlite::core::exp(clamp_slider(value) * 0.011314021114911007);
     VorBitmapContrastCurve(bitmap, static_cast<float>(exponent));
     VorBitmapEndGLEffectIfEnabled(bitmap);
 }

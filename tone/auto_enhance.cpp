@@ -30,8 +30,8 @@ Levels neutral_levels(const VorCDF& cdf) {
     for (int c = 0; c < 3; ++c) {
         const double lo = VorCDFINV(cdf.cdf[c], 0.0);
         const double hi = VorCDFINV(cdf.cdf[c], 1.0);
-        const double a = pow(lo, 0.7);
-        const double b = pow(255.0 - hi, 0.7);
+        const double a = vorlite::core::pow(lo, 0.7);
+        const double b = vorlite::core::pow(255.0 - hi, 0.7);
         levels.offset[c] = a;
         levels.scale[c] = 255.0 / (255.0 - b - a);
     }
