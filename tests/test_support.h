@@ -3,6 +3,7 @@
 // JSON-parameters runner for processor adapters.
 #pragma once
 
+#include <array>
 #include <cstddef>
 #include <cstdint>
 #include <string>
@@ -55,6 +56,9 @@ struct TestBitmap {
     }
     bool operator==(const TestBitmap& o) const { return width == o.width && bytes == o.bytes; }
 };
+
+// The four channels as numbers, so that a failed comparison prints them.
+inline std::array<int, 4> rgba(const VorColor& c) { return {c.r, c.g, c.b, c.a}; }
 
 // FNV-1a over the bytes: one number that changes with any byte, for golden values.
 inline uint32_t checksum(const uint8_t* data, std::size_t n) {
