@@ -1,139 +1,124 @@
 #include <gtest/gtest.h>
 
-#include <cstring>
 #include <string>
-#include <vector>
 
-#include "zentra_vorlite.h"
+#include "tests/test_support.h"
 
 namespace {
 
-struct Pixels {
-    VorBitmap bitmap{};
-    std::vector<uint8_t> before;
-    Pixels() {
-        VorBitmapBuild(&bitmap, 5, 3);
-        for (uint32_t i = 0; i < 60; ++i) bitmap.data[i] = static_cast<uint8_t>(37 * i + 11);
-        before.assign(bitmap.data, bitmap.data + 60);
-    }
-    ~Pixels() { VorBitmapFree(&bitmap); }
-    bool unchanged() const { return std::memcmp(bitmap.data, before.data(), 60) == 0; }
-};
+using namespace vorlite::test;
 
-VLPLRunOptions defaults() {
-    VLPLRunOptions o;
-    VorEffectInitParams(&o);
-    return o;
-}
+std::string document(const std::string& processors) { return R"({"identifier": "x", "processors": [)" + processors + "]}"; }
 
-int run(const char* json, Pixels* pixels) {
-    VLPLEffectDocument* doc = VLPLLoadEffect(json);
+// Loads, runs once with the default options and unloads; -1 when loading fails.
+int run_document(const std::string& json, TestBitmap& b) {
+    VLPLEffectDocument* doc = VLPLLoadEffect(json.c_str());
     if (doc == nullptr) return -1;
-    const VLPLRunOptions o = defaults();
-    const int result = VLPLRunEffect(doc, &pixels->bitmap, &o);
+    const VLPLRunOptions o = run_options();
+    const int result = VLPLRunEffect(doc, b.get(), &o);
     VLPLUnloadEffect(&doc);
     EXPECT_EQ(doc, nullptr);
     return result;
 }
 
 TEST(EffectLoad, RequiresTheEnvelope) {
-    struct Case {
-        const char* json;
-        bool loads;
+    const std::pair<const char*, bool> cases[] = {
+        {R"({"identifier": "x", "processors": []})", true}, {R"({"processors": [], "identifier": ""})", true},
+        {R"({"identifier": 3, "processors": []})", false},  {R"({"identifier": "x", "processors": {}})", false},
+        {R"({"identifier": "x"})", false},                  {R"(["identifier", "processors"])", false},
+        {R"({"identifier": "x", "processors": [)", false},  {"", false},
+        {"null", false},                                    {nullptr, false},
     };
-    const Case cases[] = {
-        {R"({"identifier": "x", "processors": []})", true},
-        {R"({"processors": [], "identifier": ""})", true},
-        {R"({"identifier": 3, "processors": []})", false},
-        {R"({"identifier": "x", "processors": {}})", false},
-        {R"({"identifier": "x"})", false},
-        {R"(["identifier", "processors"])", false},
-        {R"({"identifier": "x", "processors": [)", false},
-        {"", false},
-        {"null", false},
-    };
-    for (const Case& c : cases) {
-        VLPLEffectDocument* doc = VLPLLoadEffect(c.json);
-        EXPECT_EQ(doc != nullptr, c.loads) << c.json;
+    for (const auto& [json, loads] : cases) {
+        VLPLEffectDocument* doc = VLPLLoadEffect(json);
+        EXPECT_EQ(doc != nullptr, loads) << json;
         VLPLUnloadEffect(&doc);
     }
-    EXPECT_EQ(VLPLLoadEffect(nullptr), nullptr);
     VLPLUnloadEffect(nullptr);
-    VLPLEffectDocument* none = nullptr;
-    VLPLUnloadEffect(&none);
 }
 
 TEST(EffectLoad, AbsurdNestingIsRejectedBeforeParsing) {
-    std::string deep = R"({"identifier": "x", "processors": [], "deep": )";
-    deep += std::string(100000, '[') + std::string(100000, ']') + "}";
-    EXPECT_EQ(VLPLLoadEffect(deep.c_str()), nullptr);
-
-    // Brackets inside strings, escaped quotes included, are not nesting.
-    std::string quoted = R"({"identifier": "a\"[[[", "processors": [], "s": ")";
-    quoted += std::string(100000, '{') + "\"}";
-    VLPLEffectDocument* doc = VLPLLoadEffect(quoted.c_str());
-    EXPECT_NE(doc, nullptr);
-    VLPLUnloadEffect(&doc);
-
-    std::string moderate = R"({"identifier": "x", "processors": [], "n": )";
-    moderate += std::string(100, '[') + std::string(100, ']') + "}";
-    doc = VLPLLoadEffect(moderate.c_str());
-    EXPECT_NE(doc, nullptr);
-    VLPLUnloadEffect(&doc);
+    const std::pair<std::string, bool> cases[] = {
+        {R"({"identifier": "x", "processors": [], "deep": )" + std::string(100000, '[') + std::string(100000, ']') + "}", false},
+        {R"({"identifier": "x", "processors": [], "n": )" + std::string(100, '[') + std::string(100, ']') + "}", true},
+        // Brackets inside strings, escaped quotes included, are not nesting.
+        {R"({"identifier": "a\"[[[", "processors": [], "s": ")" + std::string(100000, '{') + "\"}", true},
+    };
+    for (const auto& [json, loads] : cases) {
+        VLPLEffectDocument* doc = VLPLLoadEffect(json.c_str());
+        EXPECT_EQ(doc != nullptr, loads) << json.substr(0, 50);
+        VLPLUnloadEffect(&doc);
+    }
 }
 
 TEST(EffectRun, EmptyAndOriginalLeaveThePixels) {
-    Pixels p;
-    EXPECT_EQ(run(R"({"identifier": "x", "processors": []})", &p), 1);
-    EXPECT_EQ(run(R"({"identifier": "x", "processors": [
-        {"name": "original", "parameters": {}},
-        {"name": "original", "parameters": {"ignored": [1, 2]}}]})", &p), 1);
-    EXPECT_TRUE(p.unchanged());
+    TestBitmap b(5, 3);
+    EXPECT_EQ(run_document(document(""), b), 1);
+    EXPECT_EQ(run_document(document(R"({"name": "original", "parameters": {}},
+                                       {"name": "original", "parameters": {"ignored": [1, 2]}})"), b), 1);
+    EXPECT_TRUE(b.unchanged());
 }
 
 TEST(EffectRun, ProcessorShapeFailuresEndTheRun) {
-    const char* failing[] = {
-        R"({"identifier": "x", "processors": [{"name": "original"}]})",
-        R"({"identifier": "x", "processors": [{"name": "original", "parameters": []}]})",
-        R"({"identifier": "x", "processors": [{"name": "Original", "parameters": {}}]})",
-        R"({"identifier": "x", "processors": [{"name": 1, "parameters": {}}]})",
-        R"({"identifier": "x", "processors": ["original"]})",
-        R"({"identifier": "x", "processors": [null]})",
-    };
-    for (const char* json : failing) {
-        Pixels p;
-        EXPECT_EQ(run(json, &p), 0) << json;
-        EXPECT_TRUE(p.unchanged());
+    for (const char* processor : {R"({"name": "original"})", R"({"name": "original", "parameters": []})",
+                                  R"({"name": "Original", "parameters": {}})", R"({"name": 1, "parameters": {}})",
+                                  R"("original")", "null"}) {
+        TestBitmap b(5, 3);
+        EXPECT_EQ(run_document(document(processor), b), 0) << processor;
+        EXPECT_TRUE(b.unchanged());
     }
 }
 
 TEST(EffectRun, FailureKeepsTheWorkOfEarlierProcessors) {
-    const char* two = R"({"name": "noise", "parameters": {"intensity": 0.3}},
-                         {"name": "gamma", "parameters": {"value": 1.4}})";
-    Pixels expected, actual;
-    ASSERT_EQ(run((std::string(R"({"identifier": "x", "processors": [)") + two + "]}").c_str(), &expected), 1);
+    const std::string two = R"({"name": "noise", "parameters": {"intensity": 0.3}}, {"name": "gamma", "parameters": {"value": 1.4}})";
+    TestBitmap expected(5, 3), actual(5, 3);
+    ASSERT_EQ(run_document(document(two), expected), 1);
     EXPECT_FALSE(expected.unchanged());
-    EXPECT_EQ(run((std::string(R"({"identifier": "x", "processors": [)") + two +
-                   R"(, {"name": "sepia", "parameters": {}}, {"name": "original", "parameters": {}}]})")
-                      .c_str(),
-                  &actual),
-              0);
-    EXPECT_EQ(std::memcmp(actual.bitmap.data, expected.bitmap.data, 60), 0);
+    EXPECT_EQ(run_document(document(two + R"(, {"name": "sepia", "parameters": {}}, {"name": "original", "parameters": {}})"), actual), 0);
+    EXPECT_EQ(actual.bytes, expected.bytes);
 }
 
-TEST(EffectRun, NullArgumentsFail) {
-    Pixels p;
-    VLPLEffectDocument* doc = VLPLLoadEffect(R"({"identifier": "x", "processors": []})");
+TEST(EffectRun, NullArgumentsFailAndADocumentRunsAgain) {
+    TestBitmap b(5, 3);
+    VLPLEffectDocument* doc = VLPLLoadEffect(document("").c_str());
     ASSERT_NE(doc, nullptr);
-    const VLPLRunOptions o = defaults();
-    EXPECT_EQ(VLPLRunEffect(nullptr, &p.bitmap, &o), 0);
+    const VLPLRunOptions o = run_options();
+    EXPECT_EQ(VLPLRunEffect(nullptr, b.get(), &o), 0);
     EXPECT_EQ(VLPLRunEffect(doc, nullptr, &o), 0);
-    EXPECT_EQ(VLPLRunEffect(doc, &p.bitmap, nullptr), 0);
-    EXPECT_EQ(VLPLRunEffect(doc, &p.bitmap, &o), 1);
-    // A document runs any number of times.
-    EXPECT_EQ(VLPLRunEffect(doc, &p.bitmap, &o), 1);
+    EXPECT_EQ(VLPLRunEffect(doc, b.get(), nullptr), 0);
+    EXPECT_EQ(VLPLRunEffect(doc, b.get(), &o), 1);
+    EXPECT_EQ(VLPLRunEffect(doc, b.get(), &o), 1);
     VLPLUnloadEffect(&doc);
-    EXPECT_EQ(VLPLRunProcessor(nullptr, &p.bitmap, &o), 0);
+    EXPECT_EQ(VLPLRunProcessor(nullptr, b.get(), &o), 0);
+}
+
+TEST(ProcessorDispatch, EachNameReachesItsOwnAdapter) {
+    std::string levels = "[";
+    for (int i = 0; i < 256; ++i) levels += std::to_string(i / 2 + 64) + (i < 255 ? "," : "]");
+    const std::string map = R"("histMap": {"r": )" + levels + R"(, "g": )" + levels + R"(, "b": )" + levels + "}";
+    const struct {
+        const char* name;
+        Adapter adapter;
+        std::string parameters;
+    } cases[] = {
+        {"histogramMapping", VLPLRunHistogramMappingProcessor, "{" + map + "}"},
+        {"gamma", VLPLRunGammaProcessor, R"({"value": 1.7})"},
+        {"colorMatrixTransform", VLPLRunColorMatrixTransformProcessor, R"({"operations": [{"operation": "saturation", "value": 0.3}]})"},
+        {"intensityMap", VLPLRunIntensityMapProcessor, "{" + map + R"(, "alpha": 0.9})"},
+        {"contrast", VLPLRunContrastProcessor, R"({"value": 1.7})"},
+        {"blendWithColor", VLPLRunBlendWithColorProcessor, R"({"color": {"r": 9, "g": 200, "b": 90, "a": 255}, "alpha": 0.6})"},
+        {"noise", VLPLRunNoiseProcessor, R"({"intensity": 0.3})"},
+        {"sharpness", VLPLRunSharpnessProcessor, R"({"amount": 2000, "alpha": 1})"},
+    };
+    for (const auto& c : cases) {
+        TestBitmap dispatched(23, 17), direct(23, 17);
+        const Json processor(R"({"name": ")" + std::string(c.name) + R"(", "parameters": )" + c.parameters + "}");
+        const VLPLRunOptions o = run_options(0.8, 5);
+        EXPECT_EQ(VLPLRunProcessor(processor.value, dispatched.get(), &o), 1) << c.name;
+        EXPECT_EQ(run(c.adapter, c.parameters, direct.get(), 0.8, 5), 1) << c.name;
+        EXPECT_FALSE(direct.unchanged()) << c.name;
+        EXPECT_EQ(dispatched.bytes, direct.bytes) << c.name;
+    }
 }
 
 }  // namespace
