@@ -7,39 +7,29 @@
 namespace {
 
 TEST(ArrayBuild, FailsOnThirtyTwoBitOverflowAndNullsTheSlot) {
-    struct Case {
-        uint32_t count, size;
+    const struct {
+        uint32_t a, b, size;  // b = 0: the one-factor build of a elements
         bool ok;
+    } cases[] = {
+        {0x40000000u, 0, 4, false},  // exactly 2^32 bytes
+        {0x55555556u, 0, 3, false},  // one past 0xFFFFFFFF / 3
+        {0xFFFFFFFFu, 0, 0, true},   // zero element size skips the test
+        {16, 0, 4, true},
+        {65536, 65536, 1, false},    // a x b wraps
+        {32768, 32768, 4, false},    // the element size overflows a x b
+        {7, 5, 4, true},
     };
-    const Case cases[] = {
-        {0x40000000u, 4, false},  // exactly 2^32 bytes
-        {0x55555556u, 3, false},  // one past 0xFFFFFFFF / 3
-        {0xFFFFFFFFu, 0, true},  // zero element size skips the test
-        {16, 4, true},
-    };
-    for (const Case& c : cases) {
+    for (const auto& c : cases) {
         void* slot = &slot;
-        EXPECT_EQ(VorArrayBuild(&slot, c.count, c.size), c.ok ? 1 : 0) << c.count << " x " << c.size;
-        if (!c.ok) {
-            EXPECT_EQ(slot, nullptr);
-        }
+        const int built = c.b == 0 ? VorArrayBuild(&slot, c.a, c.size) : VorArrayBuild2(&slot, c.a, c.b, c.size);
+        EXPECT_EQ(built, c.ok ? 1 : 0) << c.a << " x " << c.b << " x " << c.size;
+        EXPECT_EQ(slot != nullptr, c.ok);
+        const auto* bytes = static_cast<const uint8_t*>(slot);
+        for (uint32_t i = 0; c.ok && i < c.a * (c.b ? c.b : 1) * c.size && i < 1024; ++i) ASSERT_EQ(bytes[i], 0);
         VorArrayFree(&slot);
         EXPECT_EQ(slot, nullptr);
+        VorArrayFree(&slot);
     }
-}
-
-TEST(ArrayBuild2, ChecksBothProducts) {
-    void* slot = &slot;
-    EXPECT_EQ(VorArrayBuild2(&slot, 65536, 65536, 1), 0);  // countA x countB wraps
-    EXPECT_EQ(slot, nullptr);
-    slot = &slot;
-    EXPECT_EQ(VorArrayBuild2(&slot, 32768, 32768, 4), 0);  // the element size overflows it
-    EXPECT_EQ(slot, nullptr);
-    ASSERT_EQ(VorArrayBuild2(&slot, 7, 5, 4), 1);
-    const auto* bytes = static_cast<const uint8_t*>(slot);
-    for (int i = 0; i < 140; ++i) ASSERT_EQ(bytes[i], 0);
-    VorArrayFree(&slot);
-    VorArrayFree(&slot);
 }
 
 TEST(ArrayCopy2, CopiesExactlyTheBlockOrNothing) {

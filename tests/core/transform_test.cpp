@@ -7,67 +7,48 @@
 
 namespace {
 
-void apply(const VorTransform& t, double x, double y, double* ox, double* oy) {
-    *ox = t.a * x + t.b * y + t.tx;
-    *oy = t.c * x + t.d * y + t.ty;
-}
+bool same(const VorTransform& x, const VorTransform& y) { return std::memcmp(&x, &y, sizeof x) == 0; }
 
 TEST(Transform, NewestPostOperationAppliesLast) {
     VorTransform t;
     VorTransformSetIdentity(&t);
     VorTransformPostScale(&t, 2, 2);
-    VorTransformPostTranslate(&t, 10, 0);
-    double x, y;
-    apply(t, 1, 1, &x, &y);
-    EXPECT_EQ(x, 12.0);
-    EXPECT_EQ(y, 2.0);
-
+    VorTransformPostTranslate(&t, 10, 0);  // (1, 1) -> (12, 2)
+    EXPECT_TRUE(same(t, VorTransform{2, 0, 10, 0, 2, 0}));
     VorTransformSetIdentity(&t);
     VorTransformPostRotate(&t, M_PI / 2);
-    apply(t, 1, 0, &x, &y);
-    EXPECT_NEAR(x, 0.0, 1e-15);
-    EXPECT_EQ(y, 1.0);  // the positive angle turns x toward y
+    EXPECT_NEAR(t.a, 0.0, 1e-15);
+    EXPECT_EQ(t.c, 1.0);  // the positive angle turns x toward y
 }
 
-TEST(Transform, ConcatWithIdentityOnEitherSideAndInPlace) {
+TEST(Transform, ConcatWithIdentityInPlaceAndInTheDocumentedSumOrder) {
     const VorTransform m = {1.5, -2.0, 3.25, 0.5, 4.0, -7.0};
     VorTransform b = m;
     VorTransformConcat(&VorTransformIdentity, &b);
-    EXPECT_EQ(std::memcmp(&b, &m, sizeof m), 0);
+    EXPECT_TRUE(same(b, m));
     VorTransformSetIdentity(&b);
     VorTransformConcat(&m, &b);
-    EXPECT_EQ(std::memcmp(&b, &m, sizeof m), 0);
-
-    // A x A with both arguments the same record.
-    VorTransform sq = m;
+    EXPECT_TRUE(same(b, m));
+    VorTransform sq = m, expected = m;  // A x A with both arguments the same record
     VorTransformConcat(&sq, &sq);
-    VorTransform expected = m;
-    const VorTransform a = m;
-    VorTransformConcat(&a, &expected);
-    EXPECT_EQ(std::memcmp(&sq, &expected, sizeof sq), 0);
+    VorTransformConcat(&m, &expected);
+    EXPECT_TRUE(same(sq, expected));
+    // The translation is (1 + 2^-53) + (-1): 0, where 1 + (2^-53 - 1) would give 2^-53.
+    VorTransform t = {1, 0, 1, 0, 1, 0x1p-53};
+    const VorTransform shear = {1, 1, -1, 0, 1, 0};
+    VorTransformConcat(&shear, &t);
+    EXPECT_EQ(t.tx, 0.0);
 }
 
-TEST(TransformInverse, ScaleWithTranslation) {
+TEST(TransformInverse, ScaleWithTranslationAndSingular) {
     const VorTransform t = {2, 0, 6, 0, 4, 8};
     VorTransform inv;
     VorTransformGetInverse(&t, &inv);
-    const VorTransform expected = {0.5, -0.0, -3, -0.0, 0.25, -2};
-    EXPECT_EQ(inv.a, expected.a);
-    EXPECT_EQ(inv.b, 0.0);
-    EXPECT_EQ(inv.tx, expected.tx);
-    EXPECT_EQ(inv.c, 0.0);
-    EXPECT_EQ(inv.d, expected.d);
-    EXPECT_EQ(inv.ty, expected.ty);
-
-}
-
-TEST(TransformInverse, SingularGivesNonFiniteEntriesNotTheIdentity) {
+    const double expected[6] = {0.5, 0, -3, 0, 0.25, -2};
+    for (int k = 0; k < 6; ++k) EXPECT_EQ((&inv.a)[k], expected[k]) << k;
     const VorTransform zero = {0, 0, 0, 0, 0, 0};
-    VorTransform inv;
-    VorTransformGetInverse(&zero, &inv);
-    EXPECT_FALSE(std::isfinite(inv.a));
-    EXPECT_FALSE(std::isfinite(inv.d));
-    EXPECT_FALSE(std::isfinite(inv.tx));
+    VorTransformGetInverse(&zero, &inv);  // non-finite entries, not the identity
+    EXPECT_FALSE(std::isfinite(inv.a) || std::isfinite(inv.d) || std::isfinite(inv.tx));
 }
 
 }  // namespace
