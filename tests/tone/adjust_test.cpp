@@ -1,28 +1,33 @@
 #include <gtest/gtest.h>
 
-#include <algorithm>
 #include <cmath>
 #include <vector>
 
-#include "zentra_vorlite.h"
+#include "tests/test_support.h"
 
 namespace {
 
-using Tool = void (*)(VorBitmap*, const void*, double);
+using namespace vorlite::test;
 
-// A ramp (red = level, green = 255 - level, blue = level / 2, alpha distinctive)
-// after a tool; alpha must come through untouched.
-std::vector<uint8_t> ramp_after(Tool tool, double value) {
-    std::vector<uint8_t> bytes(256 * 4);
-    for (int i = 0; i < 256; ++i) {
-        const uint8_t pixel[4] = {static_cast<uint8_t>(i), static_cast<uint8_t>(255 - i), static_cast<uint8_t>(i / 2),
-                                  static_cast<uint8_t>(i * 11 + 3)};
-        std::copy(pixel, pixel + 4, &bytes[4 * i]);
-    }
-    VorBitmap bitmap{bytes.data(), 32, 8};
-    if (tool) tool(&bitmap, nullptr, value);
-    for (int i = 0; i < 256; ++i) EXPECT_EQ(bytes[4 * i + 3], static_cast<uint8_t>(i * 11 + 3)) << "alpha";
-    return bytes;
+using Tool = void (*)(VorBitmap*, const void*, double);
+using Curve = void (*)(VorBitmap*, float);
+
+// One pixel per level: red = level, green = 255 - level, blue = level / 2, alpha 42.
+TestBitmap ramp() {
+    TestBitmap b(32, 8);
+    for (int i = 0; i < 256; ++i) b.bytes[4 * i] = i, b.bytes[4 * i + 1] = 255 - i, b.bytes[4 * i + 2] = i / 2;
+    b.snapshot();
+    return b;
+}
+
+// The ramp after a tool or a curve; alpha must come through untouched.
+template <typename Apply, typename Value>
+std::vector<uint8_t> ramp_after(Apply apply, Value value) {
+    TestBitmap b = ramp();
+    if constexpr (std::is_same_v<Apply, Tool>) apply(b.get(), nullptr, value);
+    else apply(b.get(), value);
+    EXPECT_TRUE(b.alpha_kept());
+    return b.bytes;
 }
 
 TEST(AdjustmentTools, SlidersClampToTheirEndsAndZeroIsIdentity) {
@@ -34,10 +39,22 @@ TEST(AdjustmentTools, SlidersClampToTheirEndsAndZeroIsIdentity) {
                  {VorToolWarmth, 300.0, 100.0}};  // 300 would fold back through the cosine
     for (const auto& c : cases) EXPECT_EQ(ramp_after(c.tool, c.outside), ramp_after(c.tool, c.end)) << c.outside;
     for (Tool tool : {VorToolBrightness, VorToolSaturation, VorToolWarmth, VorToolSharpness}) {
-        EXPECT_EQ(ramp_after(tool, 0.0), ramp_after(nullptr, 0.0));
+        EXPECT_EQ(ramp_after(tool, 0.0), ramp().bytes);
     }
     const auto contrast = ramp_after(VorToolContrast, 0.0);  // the contrast curve's upper-half drop
     for (int i = 0; i < 256; ++i) EXPECT_EQ(contrast[4 * i], i <= 127 ? i : i - 1) << i;
+}
+
+TEST(AdjustmentTools, SliderEndsAreTheirCurves) {
+    const struct {
+        Tool tool;
+        double value;
+        Curve curve;
+        float exponent;
+    } cases[] = {{VorToolBrightness, -100.0, VorBitmapGamma, 2.0f},  // darkening takes the gamma branch
+                 {VorToolContrast, 100.0, VorBitmapContrastCurve, 3.1f},
+                 {VorToolContrast, -100.0, VorBitmapContrastCurve, 1.0f / 3.1f}};
+    for (const auto& c : cases) EXPECT_EQ(ramp_after(c.tool, c.value), ramp_after(c.curve, c.exponent)) << c.value;
 }
 
 TEST(AdjustmentTools, WorkedLevelsAtTheEnds) {
@@ -58,11 +75,9 @@ TEST(AdjustmentTools, WorkedLevelsAtTheEnds) {
         VorColor in, out;
     } colours[] = {{-100.0, {255, 0, 0, 9}, {54, 54, 54, 9}}, {100.0, {100, 50, 0, 9}, {143, 43, 0, 9}}};
     for (const auto& c : colours) {
-        VorColor pixel = c.in;
-        VorBitmap bitmap{&pixel.r, 1, 1};
-        VorToolSaturation(&bitmap, nullptr, c.value);
-        EXPECT_EQ((std::vector<int>{pixel.r, pixel.g, pixel.b, pixel.a}),
-                  (std::vector<int>{c.out.r, c.out.g, c.out.b, c.out.a}));
+        TestBitmap b(1, 1, c.in);
+        VorToolSaturation(b.get(), nullptr, c.value);
+        EXPECT_EQ(rgba(b.pixel(0)), rgba(c.out)) << c.value;
     }
 }
 
