@@ -1,18 +1,16 @@
 #include <gtest/gtest.h>
 
-#include <cstdint>
 #include <cstring>
 #include <limits>
-#include <random>
 #include <string>
 #include <vector>
 
-#include <yajl/yajl_tree.h>
-
 #include "color/color_internal.h"
-#include "zentra_vorlite.h"
+#include "tests/test_support.h"
 
 namespace {
+
+using namespace vorlite::test;
 
 // Every level 0..255 in each channel (rotated per channel), alpha 42, optionally
 // transformed by m or blended back over the original.
@@ -38,8 +36,8 @@ TEST(ColorMatrix, WorkedColoursAndRightComposition) {
     VorColorMatrixAdjSaturation(&grey, 0.0f);
     VorColorMatrixBrightnessContrast(&flat, 1.0f, 0.0f);
     const VorColor red = transform_colour(grey, {255, 0, 0, 42}), mid = transform_colour(flat, {3, 250, 77, 9});
-    EXPECT_TRUE(red.r == 54 && red.g == 54 && red.b == 54 && red.a == 42);
-    EXPECT_TRUE(mid.r == 128 && mid.g == 128 && mid.b == 128 && mid.a == 9);
+    EXPECT_EQ(rgba(red), rgba({54, 54, 54, 42}));
+    EXPECT_EQ(rgba(mid), rgba({128, 128, 128, 9}));
     VorColorMatrix unchanged = grey;
     VorColorMatrixContrast(&unchanged, 0.0f);
     EXPECT_EQ(std::memcmp(&unchanged, &grey, sizeof grey), 0);
@@ -89,34 +87,23 @@ TEST(ColorMatrix, CrossChannelLanesMatchGeneralPathAtEveryWidthAndExtreme) {
         {{1e30f, -1e30f, 0, 0, 1e-30f, 1, 1e-30f, -1e-30f, 0, 1e-38f, 1, 0.5f}},  // huge cancels, tiny vanish
     };
     // The lanes (through the public entry) and the general path on copies of the same bytes.
-    auto agree = [](const VorColorMatrix& m, std::vector<uint8_t> lanes, uint32_t width, uint32_t height) {
-        std::vector<uint8_t> general = lanes;
-        VorBitmap lanes_bitmap{lanes.data(), width, height}, general_bitmap{general.data(), width, height};
-        VorBitmapColorMatrixTransform(&lanes_bitmap, &m);
-        vorlite::color::color_matrix_per_pixel(&general_bitmap, m);
+    auto agree = [](const VorColorMatrix& m, TestBitmap lanes) {
+        TestBitmap general = lanes;
+        VorBitmapColorMatrixTransform(lanes.get(), &m);
+        vorlite::color::color_matrix_per_pixel(general.get(), m);
         return lanes == general;
-    };
-    std::mt19937 random(20261122);
-    // Bytes biased to 0 and 255, where clamping and rounding turn; alpha 42.
-    auto biased = [&random](std::size_t pixels) {
-        std::vector<uint8_t> bytes(pixels * 4);
-        for (std::size_t i = 0; i < bytes.size(); ++i) {
-            const unsigned pick = random() % 8;
-            bytes[i] = i % 4 == 3 ? 42 : pick < 3 ? 0 : pick < 6 ? 255 : random() % 256;
-        }
-        return bytes;
     };
     // Every (red, green) pair with blue running through its levels: a sum
     // taken in another order rounds differently somewhere here.
-    std::vector<uint8_t> pairs(65537 * 4);
-    for (std::size_t i = 0; i < 65537; ++i) pairs[i * 4] = i, pairs[i * 4 + 1] = i >> 8, pairs[i * 4 + 2] = i * 37, pairs[i * 4 + 3] = 42;
+    TestBitmap pairs(65537, 1);
+    for (std::size_t i = 0; i < 65537; ++i) pairs.bytes[i * 4] = i, pairs.bytes[i * 4 + 1] = i >> 8, pairs.bytes[i * 4 + 2] = i * 37;
     for (const VorColorMatrix& m : matrices) {
         for (uint32_t width : {1u, 2u, 3u, 4u, 5u, 7u, 8u, 13u, 61u}) {
             for (uint32_t height : {1u, 3u}) {
-                EXPECT_TRUE(agree(m, biased(width * height), width, height)) << m.m[0] << ", " << width << " x " << height;
+                EXPECT_TRUE(agree(m, TestBitmap(width, height))) << m.m[0] << ", " << width << " x " << height;
             }
         }
-        EXPECT_TRUE(agree(m, pairs, 65537, 1)) << "matrix starting " << m.m[0];
+        EXPECT_TRUE(agree(m, pairs)) << "matrix starting " << m.m[0];
     }
 }
 
@@ -150,13 +137,10 @@ TEST(ColorMatrixProcessor, FoldsOperationsUnderStrengthOrFailsUntouched) {
         {doc(R"([{"operation": "hardSet", "entries": [1,0,0,0, 0,1,0,0, 0,0,1]}])"), 1, nullptr},
     };
     for (const auto& c : cases) {
-        yajl_val parameters = yajl_tree_parse(c.json.c_str(), nullptr, 0);
-        const VLPLRunOptions options{0, c.strength, 1, 1.0};
         std::vector<uint8_t> bytes = ramp();
         VorBitmap bitmap{bytes.data(), 256, 1};
-        EXPECT_EQ(VLPLRunColorMatrixTransformProcessor(parameters, &bitmap, &options), c.expected ? 1 : 0) << c.json;
+        EXPECT_EQ(run(VLPLRunColorMatrixTransformProcessor, c.json, &bitmap, c.strength), c.expected ? 1 : 0) << c.json;
         EXPECT_TRUE(c.expected == &unchecked || bytes == (c.expected ? ramp(c.expected) : ramp())) << c.json;
-        yajl_tree_free(parameters);
     }
 }
 
