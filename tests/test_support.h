@@ -42,7 +42,6 @@ struct TestBitmap {
         : width(o.width), height(o.height), bytes(o.bytes), before(o.before), bitmap{bytes.data(), width, height} {}
     TestBitmap& operator=(const TestBitmap&) = delete;
 
-    VorBitmap* operator->() { return &bitmap; }
     VorBitmap* get() { return &bitmap; }
     uint8_t& at(uint32_t x, uint32_t y, int channel) { return bytes[(std::size_t{y} * width + x) * 4 + channel]; }
     VorColor pixel(std::size_t i) const { return {bytes[4 * i], bytes[4 * i + 1], bytes[4 * i + 2], bytes[4 * i + 3]}; }

@@ -51,21 +51,18 @@ TEST(EffectLoad, AbsurdNestingIsRejectedBeforeParsing) {
     }
 }
 
-TEST(EffectRun, EmptyAndOriginalLeaveThePixels) {
-    TestBitmap b(5, 3);
-    EXPECT_EQ(run_document(document(""), b), 1);
-    EXPECT_EQ(run_document(document(R"({"name": "original", "parameters": {}},
-                                       {"name": "original", "parameters": {"ignored": [1, 2]}})"), b), 1);
-    EXPECT_TRUE(b.unchanged());
-}
-
-TEST(EffectRun, ProcessorShapeFailuresEndTheRun) {
-    for (const char* processor : {R"({"name": "original"})", R"({"name": "original", "parameters": []})",
-                                  R"({"name": "Original", "parameters": {}})", R"({"name": 1, "parameters": {}})",
-                                  R"("original")", "null"}) {
+// "original" changes nothing; a malformed processor ends the run before any pixel.
+TEST(EffectRun, OriginalLeavesThePixelsAndProcessorShapeFailuresEndTheRun) {
+    const std::pair<const char*, int> cases[] = {
+        {"", 1}, {R"({"name": "original", "parameters": {}}, {"name": "original", "parameters": {"ignored": [1, 2]}})", 1},
+        {R"({"name": "original"})", 0}, {R"({"name": "original", "parameters": []})", 0},
+        {R"({"name": "Original", "parameters": {}})", 0}, {R"({"name": 1, "parameters": {}})", 0},
+        {R"("original")", 0}, {"null", 0},
+    };
+    for (const auto& [processors, result] : cases) {
         TestBitmap b(5, 3);
-        EXPECT_EQ(run_document(document(processor), b), 0) << processor;
-        EXPECT_TRUE(b.unchanged());
+        EXPECT_EQ(run_document(document(processors), b), result) << processors;
+        EXPECT_TRUE(b.unchanged()) << processors;
     }
 }
 
