@@ -115,6 +115,16 @@ double sin(double x);
 double cos(double x);
 double atan2(double y, double x);
 
+// Elementary functions in single precision, from core/math_float.cpp: the
+// results of the reference phone's C library, to the bit, on every target
+// and whatever traps are enabled. Exact single-precision steps call these
+// rather than ::expf and the like.
+float expf(float x);
+float logf(float x);
+float powf(float x, float y);
+float sinf(float x);
+float cosf(float x);
+
 // Working memory of an operation: a zero-filled bitmap from VorBitmapBuild,
 // released when it goes out of scope, on every path.
 class WorkingBitmap {
