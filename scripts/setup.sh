@@ -1,7 +1,7 @@
 #!/usr/bin/env bash
 # Installs what a fresh Debian machine lacks to build, test, fuzz and
 # cross-test the library. Idempotent: quiet and quick when all is present.
-#   scripts/setup.sh          library, tool, tests, fuzzer and 32-bit ARM cross-testing
+#   scripts/setup.sh          library, tool, tests, fuzzer, 32-bit ARM and musl cross-testing
 #   scripts/setup.sh --photos  the same, and the sample photographs of the demo
 set -euo pipefail
 root=$(cd "$(dirname "$0")/.." && pwd)
@@ -13,6 +13,7 @@ native_packages=(
   libgtest-dev googletest libbenchmark-dev
   clang libclang-rt-14-dev
   g++-arm-linux-gnueabihf qemu-user binutils
+  musl-tools
 )
 armhf_packages=(libyajl-dev:armhf)
 

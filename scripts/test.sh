@@ -1,6 +1,11 @@
 #!/usr/bin/env bash
 # Builds and runs every test of the library:
 #   native    the suite, natively
+#   fma-off   the native suite again with glibc's fused multiply-add variants
+#             off, so that its elementary functions are the reference ones the
+#             suite compares ours with
+#   musl      the elementary-function checker built against musl: the pinned
+#             results whatever the C library
 #   sanitize  the suite under AddressSanitizer and UndefinedBehaviorSanitizer
 #   arm       the suite cross-built for 32-bit ARM hard-float, under qemu-arm
 #   install   cmake --install, then a CMake and a pkg-config consumer
@@ -11,7 +16,7 @@ cd "$(dirname "$0")/.."
 root=$PWD
 jobs=$(nproc 2>/dev/null || echo 2)
 stages=("$@")
-[ ${#stages[@]} -eq 0 ] && stages=(native sanitize arm install fuzz)
+[ ${#stages[@]} -eq 0 ] && stages=(native fma-off musl sanitize arm install fuzz)
 
 "$root/scripts/setup.sh"
 
@@ -24,11 +29,43 @@ suite() { # NAME [cmake options...]
   (cd "$dir" && ctest -j"$jobs" --output-on-failure)
 }
 
+# scripts/check_math.cpp and core/math_float.cpp against musl, linked
+# statically. GoogleTest is not built for musl, and the library's other
+# files are not needed: the checker holds the known and special cases and
+# the sample checksums the native suite pins. libstdc++'s headers are
+# header-only here; their GNU/Linux configuration asks for glibc's version
+# macro, which musl does not have.
+musl_checker() {
+  local dir=$root/build/musl arch
+  arch=$(gcc -dumpmachine | sed 's/-linux-gnu$//')
+  mkdir -p "$dir/include"
+  ln -sfn /usr/include/yajl "$dir/include/yajl"
+  local cxx=(g++ -std=c++20 -O2 -ffp-contract=off -fno-fast-math -fno-exceptions -fno-rtti
+    -specs "/usr/lib/$arch-linux-musl/musl-gcc.specs" -nostdinc
+    -isystem "/usr/include/c++/$(g++ -dumpversion)"
+    -isystem "/usr/include/$arch-linux-gnu/c++/$(g++ -dumpversion)"
+    -isystem "/usr/include/$arch-linux-musl" -isystem "$(g++ -print-file-name=include)"
+    -isystem "$dir/include" '-D__GLIBC_PREREQ(major,minor)=0' -I"$root" -I"$root/include")
+  "${cxx[@]}" -c "$root/core/math_float.cpp" -o "$dir/math_float.o"
+  "${cxx[@]}" -c "$root/scripts/check_math.cpp" -o "$dir/check_math.o"
+  gcc -specs "/usr/lib/$arch-linux-musl/musl-gcc.specs" -static "$dir/check_math.o" "$dir/math_float.o" \
+    -o "$dir/check_math" -lm
+  "$dir/check_math" self
+}
+
 for stage in "${stages[@]}"; do
   case $stage in
     native)
       banner "native suite"
       suite native
+      ;;
+    fma-off)
+      banner "native suite with glibc's fused multiply-add variants off"
+      GLIBC_TUNABLES=glibc.cpu.hwcaps=-FMA,-AVX2 suite native
+      ;;
+    musl)
+      banner "elementary functions built against musl"
+      musl_checker
       ;;
     sanitize)
       banner "suite under AddressSanitizer and UndefinedBehaviorSanitizer"
@@ -47,7 +84,7 @@ for stage in "${stages[@]}"; do
       "$root/scripts/fuzz.sh" "${FUZZ_SECONDS:-60}"
       ;;
     *)
-      echo "test.sh: unknown stage '$stage' (native, sanitize, arm, install, fuzz)" >&2
+      echo "test.sh: unknown stage '$stage' (native, fma-off, musl, sanitize, arm, install, fuzz)" >&2
       exit 2
       ;;
   esac
