@@ -40,11 +40,13 @@ VOR_API float VorMathErfccheb(float z) {
         d = ty * d - dd + kErfcCoefficients[j];
         dd = previous;
     }
+    // The last Clenshaw step is a float step like the others; only the
+    // exponent is assembled in double.
+    const float last = kErfcCoefficients[0] + ty * d;
     const float minus_z_squared = -z * z;
     const double exponent =
         (static_cast<double>(minus_z_squared) - static_cast<double>(dd)) +
-        0.5 * (static_cast<double>(kErfcCoefficients[0]) +
-               static_cast<double>(ty) * static_cast<double>(d));
+        0.5 * static_cast<double>(last);
     return static_cast<float>(static_cast<double>(t) * ::exp(exponent));
 }
 
