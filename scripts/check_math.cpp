@@ -13,7 +13,6 @@
 //       running C library's own disagreements are shown for information.
 //
 // Prints a count of differences per family; exit status 0 when all are 0.
-#include <math.h>
 #include <pthread.h>
 #include <stdio.h>
 #include <stdlib.h>
@@ -30,23 +29,6 @@
 namespace {
 
 using namespace vorlite::test::mathf;
-
-float (*volatile libc_expf)(float) = ::expf;
-float (*volatile libc_logf)(float) = ::logf;
-float (*volatile libc_powf)(float, float) = ::powf;
-float (*volatile libc_sinf)(float) = ::sinf;
-float (*volatile libc_cosf)(float) = ::cosf;
-
-float libc(Fn fn, float x, float y) {
-    switch (fn) {
-        case Fn::exp: return libc_expf(x);
-        case Fn::log: return libc_logf(x);
-        case Fn::pow: return libc_powf(x, y);
-        case Fn::sin: return libc_sinf(x);
-        case Fn::cos: return libc_cosf(x);
-    }
-    return 0.0f;
-}
 
 float as_float(std::uint32_t b) { return std::bit_cast<float>(b); }
 std::uint32_t word(float f) { return std::bit_cast<std::uint32_t>(f); }

@@ -5,6 +5,8 @@
 #ifndef VORLITE_TESTS_CORE_MATH_FLOAT_CASES_H
 #define VORLITE_TESTS_CORE_MATH_FLOAT_CASES_H
 
+#include <math.h>
+
 #include <array>
 #include <bit>
 #include <cstdint>
@@ -36,6 +38,26 @@ inline float ours(Fn fn, float x, float y) {
         case Fn::pow: return core::powf(x, y);
         case Fn::sin: return core::sinf(x);
         case Fn::cos: return core::cosf(x);
+    }
+    return 0.0f;
+}
+
+// The C library's functions through pointers the compiler cannot see
+// through: a call with a constant argument would otherwise be folded at
+// build time by the compiler's own, correctly rounded, arithmetic.
+inline float (*volatile libc_expf)(float) = ::expf;
+inline float (*volatile libc_logf)(float) = ::logf;
+inline float (*volatile libc_powf)(float, float) = ::powf;
+inline float (*volatile libc_sinf)(float) = ::sinf;
+inline float (*volatile libc_cosf)(float) = ::cosf;
+
+inline float libc(Fn fn, float x, float y) {
+    switch (fn) {
+        case Fn::exp: return libc_expf(x);
+        case Fn::log: return libc_logf(x);
+        case Fn::pow: return libc_powf(x, y);
+        case Fn::sin: return libc_sinf(x);
+        case Fn::cos: return libc_cosf(x);
     }
     return 0.0f;
 }

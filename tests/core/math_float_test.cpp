@@ -1,5 +1,4 @@
 #include <gtest/gtest.h>
-#include <math.h>
 
 #include <bit>
 #include <cfenv>
@@ -17,26 +16,6 @@ using namespace vorlite::test::mathf;
 
 float bits_float(std::uint32_t b) { return std::bit_cast<float>(b); }
 std::uint32_t float_word(float f) { return std::bit_cast<std::uint32_t>(f); }
-
-// The C library's functions through pointers the compiler cannot see
-// through: a call with a constant argument would otherwise be folded at
-// build time by the compiler's own, correctly rounded, arithmetic.
-float (*volatile libc_expf)(float) = ::expf;
-float (*volatile libc_logf)(float) = ::logf;
-float (*volatile libc_powf)(float, float) = ::powf;
-float (*volatile libc_sinf)(float) = ::sinf;
-float (*volatile libc_cosf)(float) = ::cosf;
-
-float libc(Fn fn, float x, float y) {
-    switch (fn) {
-        case Fn::exp: return libc_expf(x);
-        case Fn::log: return libc_logf(x);
-        case Fn::pow: return libc_powf(x, y);
-        case Fn::sin: return libc_sinf(x);
-        case Fn::cos: return libc_cosf(x);
-    }
-    return 0.0f;
-}
 
 std::string describe(Fn fn, Pair args) {
     char text[64];
