@@ -3,6 +3,7 @@
 #define VORLITE_TONE_INTERNAL_H
 
 #include <array>
+#include <cstddef>
 #include <cstdint>
 
 #include "core/core_internal.h"
@@ -47,11 +48,27 @@ struct BoxHybridShape {
 // False when the scaled amount is 0, so the pass leaves the bitmap alone.
 bool box_hybrid_shape(std::uint32_t width, std::uint32_t height, float amount,
                       BoxHybridShape* shape);
-// The 2r + 1 box weights on the 4096 fixed-point scale, truncated.
+// Box weights are fixed point with 4096 for one; the weighted sum of a
+// pixel starts at 2048 so that dividing by 4096 rounds.
+inline constexpr std::int32_t k_box_hybrid_weight_one = 4096;
+inline constexpr std::uint32_t k_box_hybrid_rounding = 2048;
+// The 2r + 1 box weights k on the 4096 fixed-point scale, truncated.
 void box_hybrid_weights(const BoxHybridShape& shape, std::int32_t* weights);
+// r never exceeds 4, so a pass reads at most 2r + 2 = 10 prefix sums.
+inline constexpr std::size_t k_box_hybrid_max_taps = 10;
+// The difference kernel d of the 2r + 2 prefix-sum reads, modulo 2^32:
+// d_0 = -k_0, d_j = k_(j-1) - k_j, d_(2r+1) = k_(2r).
+using BoxHybridKernel = std::array<std::uint32_t, k_box_hybrid_max_taps>;
+BoxHybridKernel box_hybrid_difference_kernel(const BoxHybridShape& shape);
 // One pass (rows, or columns when `columns`) computed the plain way from the
 // integral lines, for holding the vectorised running-sum form against.
 void box_hybrid_pass_reference(VorBitmap* bitmap, float amount, bool columns);
+// One pass of a bitmap with pixels in the running-sum vector form, storing
+// the reference's bytes. False, with the bitmap untouched, where that form
+// does not apply (a difference weight beyond 16 bits, a kernel far wider
+// than the line, no vector lanes): the caller then runs the reference.
+// Working memory that cannot be had leaves the bitmap alone.
+bool box_hybrid_pass_fast(VorBitmap* bitmap, const BoxHybridShape& shape, bool columns);
 // Both passes with the vertical one streamed right behind the horizontal
 // one, so that each row of the bitmap is read and written once. `finish`
 // receives each bitmap row, still holding its original pixels, and the row

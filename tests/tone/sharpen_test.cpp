@@ -2,8 +2,10 @@
 
 #include <algorithm>
 #include <cmath>
+#include <cstring>
 #include <vector>
 
+#include "core/simd.h"
 #include "tone/tone_internal.h"
 #include "zentra_vorlite.h"
 
@@ -118,7 +120,8 @@ TEST(BoxHybridPass, RowsMatchAClampedBoxConvolutionAndColumnsTheTransposedRows) 
 }
 
 TEST(BoxHybridPass, RunningSumFormStoresTheBytesOfTheIntegralLineForm) {
-    // Widths around the four-pixel groups and the 128-column strips, lines
+    if (!VORLITE_VECTOR_LANES) GTEST_SKIP() << "without vector lanes every pass takes the integral-line form";
+    // Widths around the four-pixel groups and the 16-column bands, lines
     // shorter than the kernel, one-pixel lines, boxes of 1, 3, 5 and wider.
     const struct {
         uint32_t width, height;
@@ -127,22 +130,30 @@ TEST(BoxHybridPass, RunningSumFormStoresTheBytesOfTheIntegralLineForm) {
                  {3, 29, -2500.0f},  {5, 6, 100.0f},     {131, 9, 100.0f},   {130, 7, -400.0f},
                  {257, 33, 107.0f},  {255, 61, -420.0f}, {64, 300, 250.0f},  {9, 200, -3000.0f},
                  {31, 47, 60000.0f}, {40, 30, -100.0f},  {129, 128, -5.0f},  {6, 5, -200000.0f}};
+    const auto store = [](uint8_t* row, uint8_t* filtered, uint32_t width) { std::memcpy(row, filtered, 4 * width); };
     for (const auto& c : cases) {
+        const BoxHybridShape shape = shape_of(c.width, c.height, c.amount);
         for (bool columns : {false, true}) {
             Image fast(c.width, c.height);
             Image reference = fast;
-            (columns ? VorBoxHybridSharpenY : VorBoxHybridSharpenX)(&fast.bitmap, c.amount);
+            ASSERT_TRUE(vorlite::tone::box_hybrid_pass_fast(&fast.bitmap, shape, columns)) << c.amount;
             vorlite::tone::box_hybrid_pass_reference(&reference.bitmap, c.amount, columns);
             ASSERT_EQ(fast.bytes, reference.bytes) << c.width << "x" << c.height << " " << c.amount << " " << columns;
         }
         // Both passes streamed together match the reference passes in turn.
         Image both(c.width, c.height);
         Image reference = both;
-        VorConvolutionEffectBoxHybridSharpen(&both.bitmap, c.amount);
+        ASSERT_EQ(vorlite::tone::box_hybrid_two_passes(&both.bitmap, c.amount, store), vorlite::tone::TwoPasses::done);
         vorlite::tone::box_hybrid_pass_reference(&reference.bitmap, c.amount, false);
         vorlite::tone::box_hybrid_pass_reference(&reference.bitmap, c.amount, true);
         ASSERT_EQ(both.bytes, reference.bytes) << c.width << "x" << c.height << " " << c.amount;
     }
+    // A kernel far wider than the line is left to the reference form, untouched.
+    Image image(7, 5);
+    const std::vector<uint8_t> before = image.bytes;
+    EXPECT_FALSE(vorlite::tone::box_hybrid_pass_fast(&image.bitmap, shape_of(7, 5, 1e30f), false));
+    EXPECT_EQ(vorlite::tone::box_hybrid_two_passes(&image.bitmap, 1e30f, store), vorlite::tone::TwoPasses::unavailable);
+    EXPECT_EQ(image.bytes, before);
 }
 
 TEST(BoxHybridPass, ZeroOrUndefinedAmountLeavesBitmapAloneAndAbsurdOnesKeepAlpha) {
