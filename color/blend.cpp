@@ -9,9 +9,9 @@ namespace vorlite::color {
 namespace {
 
 using core::float_bits;
+using core::k_inv255;
 
-constexpr float k_inv255 = float_bits(0x3B808081u);  // 1/255
-constexpr float k_2_255 = float_bits(0x3C008081u);   // 2/255
+constexpr float k_2_255 = float_bits(0x3C008081u);  // 2/255
 
 // Hosts allocate the memo as one plain block of this size.
 static_assert(sizeof(VorColorBlendMemoTable) == 196868);
@@ -108,9 +108,7 @@ inline VorColor color_mode_target(const VorColor& dst, const float src_hsl[3], i
     float hsl[3];
     hsl[0] = src_hsl[0];
     hsl[1] = (src_hsl[1] * k_inv255) * static_cast<float>(src_alpha);
-    hsl[2] = ((static_cast<float>(dst.g) * 0.71516f + static_cast<float>(dst.r) * 0.212671f) +
-              static_cast<float>(dst.b) * 0.072169f) *
-             k_inv255;
+    hsl[2] = luminance(dst.r, dst.g, dst.b) * k_inv255;
     VorColor c;
     VorColorHSL2RGB(hsl, &c);
     return c;
@@ -135,6 +133,20 @@ void fill_channel_row(int source_level, float op, std::uint8_t row[256]) {
 bool blend_channel_row(std::uint32_t mode, int source_level, float opacity, std::uint8_t row[256]) {
     return visit_channel_rule(
         mode, [&]<ChannelRule Rule>() { fill_channel_row<Rule>(source_level, opacity, row); });
+}
+
+ChannelPairTable::ChannelPairTable(std::uint32_t mode, float opacity) : mode_(mode), opacity_(opacity) {
+    entries_.build(256, 256);
+}
+
+void ChannelPairTable::fill_row(std::uint8_t source) {
+    blend_channel_row(mode_, source, opacity_, &entries_[std::size_t{source} << 8]);
+    filled_[source] = true;
+}
+
+const std::uint8_t* ChannelPairTable::entries() {
+    for (int s = 0; s < 256; ++s) row(static_cast<std::uint8_t>(s));
+    return entries_.get();
 }
 
 void blend_grey_maps(const VorColor& src, std::uint32_t mode, float opacity, std::uint8_t red[256],

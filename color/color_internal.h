@@ -3,8 +3,10 @@
 #define VORLITE_COLOR_INTERNAL_H
 
 #include <array>
+#include <cstddef>
 #include <cstdint>
 
+#include "core/core_internal.h"
 #include "zentra_vorlite.h"
 
 namespace vorlite::color {
@@ -29,6 +31,43 @@ void blend_grey_maps(const VorColor& src, std::uint32_t mode, float opacity, std
 // VorColorBlend over destination level b from the given source level.
 // Returns false, leaving row alone, for the colour mode.
 bool blend_channel_row(std::uint32_t mode, int source_level, float opacity, std::uint8_t row[256]);
+
+// Blend modes: every blend_channel_row of one mode (not the colour mode)
+// and opacity, entry (s << 8) | b for source level s over destination
+// level b. A large bitmap costs 65,536 blends this way instead of one per
+// pixel; a row is filled when first asked for, so a small one costs fewer.
+class ChannelPairTable {
+public:
+    ChannelPairTable(std::uint32_t mode, float opacity);
+    ChannelPairTable(const ChannelPairTable&) = delete;
+    ChannelPairTable& operator=(const ChannelPairTable&) = delete;
+
+    // False when its 64 KiB could not be had; nothing else may be called then.
+    bool valid() const { return entries_.get() != nullptr; }
+    // The 256 results over each destination level from one source level.
+    const std::uint8_t* row(std::uint8_t source) {
+        if (!filled_[source]) fill_row(source);
+        return &entries_[std::size_t{source} << 8];
+    }
+    // The whole table, every row filled.
+    const std::uint8_t* entries();
+
+private:
+    void fill_row(std::uint8_t source);
+
+    std::uint32_t mode_;
+    float opacity_;
+    std::array<bool, 256> filled_{};
+    core::WorkingArray<std::uint8_t> entries_;
+};
+
+// Blend modes: the luminance of a colour on the 0..255 scale, from the
+// sRGB weights, summed green, red, blue in that order (the colour mode's
+// lightness and the intensity map's level both depend on the order).
+inline float luminance(int r, int g, int b) {
+    return (static_cast<float>(g) * 0.71516f + static_cast<float>(r) * 0.212671f) +
+           static_cast<float>(b) * 0.072169f;
+}
 
 // Colour matrices: the three tone tables of a matrix without cross-channel
 // terms, the same bytes as transforming each level; false, leaving map

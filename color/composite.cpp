@@ -3,24 +3,18 @@
 // per-pixel blend modes.
 #include <cstddef>
 #include <cstdint>
-#include <memory>
-#include <new>
-
-#if defined(__SSE2__)
-#include <emmintrin.h>
-#endif
 
 #include "color/color_internal.h"
 #include "core/core_internal.h"
+#include "core/simd.h"
 #include "proclist/proclist_internal.h"
 
 namespace vorlite::color {
 namespace {
 
+using core::k_inv255;
 using core::load_pixel;
 using core::store_pixel;
-
-constexpr float k_inv255 = core::float_bits(0x3B808081u);  // 1/255
 
 // The rows and columns both bitmaps cover, anchored at the top-left corner.
 struct CommonArea {
@@ -35,15 +29,14 @@ CommonArea common_area(const VorBitmap& dst, const VorBitmap& src) {
 
 // Every mode but the colour mode blends each channel on its own, so a
 // channel's result depends on the destination and source levels alone. On a
-// large area one 256 x 256 table of grey blends (row = source level, column
-// = destination level) replaces the per-pixel blend with the same bytes.
+// large area the channel-pair table of the mode replaces the per-pixel
+// blend with the same bytes.
 constexpr std::size_t k_pair_table_threshold = 65536;
 
-std::unique_ptr<std::uint8_t[]> channel_pair_table(std::uint32_t mode, float opacity) {
-    std::unique_ptr<std::uint8_t[]> table(new (std::nothrow) std::uint8_t[256 * 256]);
-    if (!table) return table;
-    for (int s = 0; s < 256; ++s) blend_channel_row(mode, s, opacity, &table[s * 256]);
-    return table;
+inline void blend_channels_through(const std::uint8_t* table, std::uint8_t* d, const std::uint8_t* s) {
+    d[0] = table[(s[0] << 8) | d[0]];
+    d[1] = table[(s[1] << 8) | d[1]];
+    d[2] = table[(s[2] << 8) | d[2]];
 }
 
 void blend_through_pair_table(const VorBitmap& dst, const VorBitmap& src, CommonArea area,
@@ -56,14 +49,12 @@ void blend_through_pair_table(const VorBitmap& dst, const VorBitmap& src, Common
                 core::prefetch_ahead<true>(d);
                 core::prefetch_ahead<false>(s);
             }
-            d[0] = table[(s[0] << 8) | d[0]];
-            d[1] = table[(s[1] << 8) | d[1]];
-            d[2] = table[(s[2] << 8) | d[2]];
+            blend_channels_through(table, d, s);
         }
     }
 }
 
-#if defined(__SSE2__)
+#if VORLITE_NATIVE_INTEGER_LANES
 // Many tables are a plain weighted mean in integers: (w s + (256 - w) b +
 // 128) / 256 for one weight w, normal mode at opacity 0.5 among them. When
 // that formula gives every one of the table's 65,536 entries, it gives the
@@ -90,19 +81,31 @@ int mean_weight(const std::uint8_t* table, float opacity) {
     return is_weighted_mean(table, w) ? static_cast<int>(w) : -1;
 }
 
-inline __m128i mean_of_halves(__m128i over, __m128i below, __m128i w, __m128i rest, __m128i half) {
-    const __m128i sum = _mm_add_epi16(_mm_add_epi16(_mm_mullo_epi16(over, w), _mm_mullo_epi16(below, rest)), half);
-    return _mm_srli_epi16(sum, k_mean_shift);
+using core::simd::u16x8;
+using core::simd::u8x16;
+
+// Eight channels: every product and sum fits 16 bits, at most 256 x 255 + 128.
+inline u16x8 weighted_mean(u16x8 over, u16x8 below, std::uint16_t weight) {
+    const auto rest = static_cast<std::uint16_t>(256u - weight);
+    return (over * weight + below * rest + 128) >> k_mean_shift;
 }
 
-// Every product and sum fits 16 bits: at most 256 x 255 + 128.
+// Four pixels of the mean: colour channels mixed, alpha kept from below.
+inline u8x16 weighted_mean_quad(u8x16 over, u8x16 below, std::uint16_t weight) {
+    using namespace core::simd;
+    const u16x8 low = weighted_mean(widen_low(over), widen_low(below), weight);
+    const u16x8 high = weighted_mean(widen_high(over), widen_high(below), weight);
+    // Every mean is at most 255, so narrowing with a clamp keeps it whole.
+    const u8x16 mixed = narrow_clamped(reinterpret_cast<i16x8>(low), reinterpret_cast<i16x8>(high));
+    const u8x16 alpha = {0, 0, 0, 255, 0, 0, 0, 255, 0, 0, 0, 255, 0, 0, 0, 255};
+    return (mixed & ~alpha) | (below & alpha);
+}
+
+// Four pixels at a time through the mean, the last one to three through
+// the table it matches.
 void blend_weighted_mean(const VorBitmap& dst, const VorBitmap& src, CommonArea area, unsigned weight,
                          const std::uint8_t* table) {
-    const __m128i zero = _mm_setzero_si128();
-    const __m128i w = _mm_set1_epi16(static_cast<short>(weight));
-    const __m128i rest = _mm_set1_epi16(static_cast<short>(256u - weight));
-    const __m128i half = _mm_set1_epi16(128);
-    const __m128i alpha = _mm_set1_epi32(static_cast<int>(0xFF000000u));
+    const auto w = static_cast<std::uint16_t>(weight);
     for (std::uint32_t y = 0; y < area.height; ++y) {
         std::uint8_t* d = dst.data + static_cast<std::size_t>(y) * dst.width * 4;
         const std::uint8_t* s = src.data + static_cast<std::size_t>(y) * src.width * 4;
@@ -112,22 +115,21 @@ void blend_weighted_mean(const VorBitmap& dst, const VorBitmap& src, CommonArea 
                 core::prefetch_ahead<true>(d);
                 core::prefetch_ahead<false>(s);
             }
-            const __m128i below = _mm_loadu_si128(reinterpret_cast<const __m128i*>(d));
-            const __m128i over = _mm_loadu_si128(reinterpret_cast<const __m128i*>(s));
-            const __m128i low = mean_of_halves(_mm_unpacklo_epi8(over, zero), _mm_unpacklo_epi8(below, zero), w,
-                                               rest, half);
-            const __m128i high = mean_of_halves(_mm_unpackhi_epi8(over, zero), _mm_unpackhi_epi8(below, zero), w,
-                                                rest, half);
-            const __m128i mixed = _mm_packus_epi16(low, high);
-            const __m128i out = _mm_or_si128(_mm_andnot_si128(alpha, mixed), _mm_and_si128(alpha, below));
-            _mm_storeu_si128(reinterpret_cast<__m128i*>(d), out);
+            const u8x16 mixed = weighted_mean_quad(core::simd::load<u8x16>(s), core::simd::load<u8x16>(d), w);
+            core::simd::store(d, mixed);
         }
-        for (; x < area.width; ++x, d += 4, s += 4) {
-            d[0] = table[(s[0] << 8) | d[0]];
-            d[1] = table[(s[1] << 8) | d[1]];
-            d[2] = table[(s[2] << 8) | d[2]];
-        }
+        for (; x < area.width; ++x, d += 4, s += 4) blend_channels_through(table, d, s);
     }
+}
+
+// The blend through the weighted mean when the table is one; false, with
+// nothing done, when it is not.
+bool blend_if_weighted_mean(const VorBitmap& dst, const VorBitmap& src, CommonArea area, const std::uint8_t* table,
+                            float opacity) {
+    const int weight = mean_weight(table, opacity);
+    if (weight < 0) return false;
+    blend_weighted_mean(dst, src, area, static_cast<unsigned>(weight), table);
+    return true;
 }
 #endif
 
@@ -266,16 +268,13 @@ VOR_API void VorBitmapBlendBitmap(VorBitmap* dst, const VorBitmap* src, uint32_t
     const CommonArea area = common_area(*dst, *src);
     if (mode != VOR_BLEND_COLOR &&
         static_cast<std::size_t>(area.width) * area.height > k_pair_table_threshold) {
-        const auto table = channel_pair_table(mode, opacity);
-        if (table) {
-#if defined(__SSE2__)
-            const int weight = mode == VOR_BLEND_NORMAL ? mean_weight(table.get(), opacity) : -1;
-            if (weight >= 0) {
-                blend_weighted_mean(*dst, *src, area, static_cast<unsigned>(weight), table.get());
-                return;
-            }
+        ChannelPairTable table(mode, opacity);
+        if (table.valid()) {
+            const std::uint8_t* entries = table.entries();
+#if VORLITE_NATIVE_INTEGER_LANES
+            if (mode == VOR_BLEND_NORMAL && blend_if_weighted_mean(*dst, *src, area, entries, opacity)) return;
 #endif
-            blend_through_pair_table(*dst, *src, area, table.get());
+            blend_through_pair_table(*dst, *src, area, entries);
             return;
         }
     }

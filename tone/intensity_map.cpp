@@ -8,15 +8,16 @@
 #include "proclist/proclist_internal.h"
 #include "tone/tone_internal.h"
 
+namespace vorlite::tone {
 namespace {
 
-using vorlite::core::load_pixel;
-using vorlite::core::pixel_count;
-using vorlite::core::store_pixel;
+using core::load_pixel;
+using core::pixel_count;
+using core::store_pixel;
 
 // Luminance rounded to the level that indexes the map.
 inline std::uint8_t luminance_level(const std::uint8_t* p) {
-    const float y = (p[1] * 0.71516f + p[0] * 0.212671f) + p[2] * 0.072169f;
+    const float y = color::luminance(p[0], p[1], p[2]);
     if (y <= 254.5f) return static_cast<std::uint8_t>(static_cast<int>(static_cast<double>(y) + 0.5));
     return 255;
 }
@@ -25,36 +26,13 @@ VorColor mapped_colour(const VorHistMap& map, std::uint8_t level) {
     return VorColor{map.map[0][level], map.map[1][level], map.map[2][level], 255};
 }
 
-// result[S][B] of blending source byte S over destination byte B, for any
-// mode but the colour mode (whose channels depend on each other), each row
-// filled when a pixel first needs it, so a photo costs at most 65536 blends
-// instead of one per pixel.
-class BlendTable {
-public:
-    BlendTable(std::uint32_t mode, float opacity) : mode_(mode), opacity_(opacity) {}
-
-    const std::uint8_t* row(std::uint8_t source) {
-        auto& r = rows_[source];
-        if (!filled_[source]) {
-            filled_[source] = true;
-            vorlite::color::blend_channel_row(mode_, source, opacity_, r.data());
-        }
-        return r.data();
-    }
-
-private:
-    std::uint32_t mode_;
-    float opacity_;
-    std::array<bool, 256> filled_{};
-    std::array<std::array<std::uint8_t, 256>, 256> rows_;
-};
-
-void intensity_map_by_table(VorBitmap* bitmap, const VorHistMap& map, std::uint32_t mode,
-                            float opacity) {
-    BlendTable table(mode, opacity);
+// Any mode but the colour mode through the mode's channel-pair table, whose
+// rows are filled as levels first need them: a photo costs at most 65,536
+// blends instead of one per pixel.
+void intensity_map_by_table(VorBitmap* bitmap, const VorHistMap& map, color::ChannelPairTable& table) {
     // Per luminance level, the three result rows of its mapped colour.
     std::array<std::array<const std::uint8_t*, 3>, 256> rows{};
-    vorlite::core::for_each_pixel(bitmap->data, pixel_count(*bitmap), [&](std::uint8_t* p) {
+    core::for_each_pixel(bitmap->data, pixel_count(*bitmap), [&](std::uint8_t* p) {
         const std::uint8_t level = luminance_level(p);
         auto& level_rows = rows[level];
         if (level_rows[0] == nullptr) {
@@ -64,18 +42,6 @@ void intensity_map_by_table(VorBitmap* bitmap, const VorHistMap& map, std::uint3
         p[1] = level_rows[1][p[1]];
         p[2] = level_rows[2][p[2]];
     });
-}
-
-void intensity_map_per_pixel(VorBitmap* bitmap, const VorHistMap& map, std::uint32_t mode,
-                             float opacity) {
-    std::uint8_t* p = bitmap->data;
-    const std::size_t n = pixel_count(*bitmap);
-    for (std::size_t i = 0; i < n; ++i, p += 4) {
-        const VorColor layer = mapped_colour(map, luminance_level(p));
-        VorColor base = load_pixel(p);
-        VorColorBlend(&base, &layer, mode, opacity);
-        store_pixel(p, base);
-    }
 }
 
 // The colour mode through VorColorBlendColorMode, with each level's mapped
@@ -101,18 +67,37 @@ void intensity_map_colour(VorBitmap* bitmap, const VorHistMap& map, float opacit
 
 }  // namespace
 
+void intensity_map_per_pixel(VorBitmap* bitmap, const VorHistMap& map, std::uint32_t mode, float opacity) {
+    std::uint8_t* p = bitmap->data;
+    const std::size_t n = pixel_count(*bitmap);
+    for (std::size_t i = 0; i < n; ++i, p += 4) {
+        const VorColor layer = mapped_colour(map, luminance_level(p));
+        VorColor base = load_pixel(p);
+        VorColorBlend(&base, &layer, mode, opacity);
+        store_pixel(p, base);
+    }
+}
+
+}  // namespace vorlite::tone
+
+using namespace vorlite::tone;
+
 extern "C" {
 
 VOR_API void VorBitmapIntensityMap(VorBitmap* bitmap, const VorHistMap* map, uint32_t mode,
                                    double alpha) {
     const auto opacity = static_cast<float>(alpha);
     if (mode != VOR_BLEND_COLOR) {
-        intensity_map_by_table(bitmap, *map, mode, opacity);
-    } else if (mode == VOR_BLEND_COLOR && opacity >= 0.0f && opacity <= 1.0f) {
+        vorlite::color::ChannelPairTable table(mode, opacity);
+        if (table.valid()) {
+            intensity_map_by_table(bitmap, *map, table);
+            return;
+        }
+    } else if (opacity >= 0.0f && opacity <= 1.0f) {
         intensity_map_colour(bitmap, *map, opacity);
-    } else {
-        intensity_map_per_pixel(bitmap, *map, mode, opacity);
+        return;
     }
+    intensity_map_per_pixel(bitmap, *map, mode, opacity);
 }
 
 VOR_API int VLPLRunIntensityMapProcessor(const yajl_val parameters, VorBitmap* bitmap,

@@ -79,6 +79,11 @@ enum class TwoPasses { done, unavailable, out_of_memory };
 using FinishRow = void (*)(std::uint8_t* row, std::uint8_t* filtered, std::uint32_t width);
 TwoPasses box_hybrid_two_passes(VorBitmap* bitmap, float amount, FinishRow finish);
 
+// Intensity map: VorBitmapIntensityMap one pixel at a time, each pixel's
+// mapped colour blended with VorColorBlend. The table and colour-mode
+// paths of the map give its bytes.
+void intensity_map_per_pixel(VorBitmap* bitmap, const VorHistMap& map, std::uint32_t mode, float opacity);
+
 // Histograms: the per-channel histogram of a bitmap and its cumulative
 // distribution, in working memory released with the record.
 struct ChannelStatistics {

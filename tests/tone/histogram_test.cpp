@@ -57,22 +57,6 @@ TEST(CumulativeDistributions, NormaliseFallBackToUniformAndInvert) {
     for (const auto& p : cases) EXPECT_DOUBLE_EQ(VorCDFINV(c, p[0]), p[1]) << p[0];
 }
 
-TEST(IntensityMap, PicksTheMapColourAtTheRoundedLuminance) {
-    const VorHistMap m = sample_map();
-    const struct {
-        VorColor pixel;
-        int level;
-    } cases[] = {{{255, 0, 0, 7}, 54}, {{0, 255, 0, 8}, 182}, {{255, 255, 255, 12}, 255},
-                 {{0, 1, 0, 14}, 1}, {{2, 0, 0, 15}, 0}};  // 0.715 rounds up, 0.425 down
-    for (const auto& c : cases) {
-        VorColor px = c.pixel;
-        VorBitmap b{reinterpret_cast<uint8_t*>(&px), 1, 1};
-        VorBitmapIntensityMap(&b, &m, VOR_BLEND_NORMAL, 1.0);
-        EXPECT_EQ((std::vector<int>{px.r, px.g, px.b, px.a}),
-                  (std::vector<int>{m.map[0][c.level], m.map[1][c.level], m.map[2][c.level], c.pixel.a}));
-    }
-}
-
 TEST(MapProcessors, StrengthFadesTheMapAndScalesTheIntensityOpacity) {
     const VorHistMap m = sample_map();
     const std::string mapping = R"({"histMap":)" + json_map(m) + "}";
