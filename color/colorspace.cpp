@@ -5,7 +5,6 @@
 
 #include <cstddef>
 #include <cstdint>
-#include <cstring>
 
 #include "color/color_internal.h"
 #include "core/core_internal.h"
@@ -14,9 +13,7 @@
 namespace vorlite::color {
 namespace {
 
-using core::float_bits;
-
-constexpr float k_inv255 = float_bits(0x3B808081u);  // 1/255
+using core::k_inv255;
 
 void fill_linear_table(float table[256]) {
     for (int v = 0; v < 256; ++v) {
@@ -159,24 +156,16 @@ const LabFastTables& lab_fast_tables() {
     return tables;
 }
 
-using core::simd::f64x2;
-
-// store_truncated on both lanes, written as two bytes. SSE2 truncates first
-// and then narrows with signed and unsigned saturation: for values within
-// the 32-bit range that clamps to 0..255 exactly as clamping before
-// truncation does (-1 < v < 0 gives 0 either way), and the a* and b* sums
-// stay within -310..565 because every cube root lies in 0.137..1.
-inline void store_truncated2(std::uint8_t* p, f64x2 v) {
-#if defined(__SSE2__)
-    const __m128i truncated = _mm_cvttpd_epi32(v);
-    const __m128i words = _mm_packs_epi32(truncated, truncated);
-    const __m128i bytes = _mm_packus_epi16(words, words);
-    // Through a general register: one move, no word extract.
-    const auto pair = static_cast<std::uint16_t>(_mm_cvtsi128_si32(bytes));
-    std::memcpy(p, &pair, 2);
+// a* and b*, stored by truncation. Every cube root lies in 0.137..1, so
+// both sums stay within -310..565, inside the range the two-lane store
+// admits.
+inline void store_chroma(std::uint8_t* p, double fx, double fy, double fz) {
+#if VORLITE_VECTOR_LANES
+    using core::simd::f64x2;
+    core::simd::store_truncated_pair(p, f64x2{500.0, 200.0} * (f64x2{fx, fy} - f64x2{fy, fz}) + 127.0);
 #else
-    p[0] = core::store_truncated(v[0]);
-    p[1] = core::store_truncated(v[1]);
+    p[0] = core::store_truncated(500.0 * (fx - fy) + 127.0);
+    p[1] = core::store_truncated(200.0 * (fy - fz) + 127.0);
 #endif
 }
 
@@ -215,8 +204,7 @@ inline void rgb_to_lab_fast(std::uint8_t* p, const LabFastTables& t) {
         fz = lab_compand_scaled(z, t.cbrt);
         p[0] = core::store_truncated(packed_lightness(fy));
     }
-    // a = 500 (fx - fy) + 127 and b = 200 (fy - fz) + 127, one per lane.
-    store_truncated2(p + 1, f64x2{500.0, 200.0} * (f64x2{fx, fy} - f64x2{fy, fz}) + 127.0);
+    store_chroma(p + 1, fx, fy, fz);
 }
 
 inline float lab_inverse_compand(float f) {
