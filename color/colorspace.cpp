@@ -74,8 +74,8 @@ struct Lab {
 constexpr double k_xyz_weights[3][3] = {{0.00433891, 0.002126, 0.000177255},
                                         {0.00376234915, 0.007152, 0.00109475308},
                                         {0.0018990604648, 0.000722, 0.0087295537}};
-enum Channel { kRed, kGreen, kBlue };
-enum Axis { kX, kY, kZ };
+enum Channel { k_red, k_green, k_blue };
+enum Axis { k_x, k_y, k_z };
 
 // L* scaled to the byte range, before storing.
 inline double packed_lightness(double fy) { return (116.0 * fy - 16.0) * 2.55; }
@@ -86,9 +86,9 @@ inline Lab rgb_to_lab(const VorColor& c, const float* linear, CubeRoot cube_root
     const double gl = linear[c.g];
     const double bl = linear[c.b];
     const auto& w = k_xyz_weights;
-    const double x = (gl * w[kGreen][kX] + rl * w[kRed][kX]) + bl * w[kBlue][kX];
-    const double y = (gl * w[kGreen][kY] + rl * w[kRed][kY]) + bl * w[kBlue][kY];
-    const double z = (gl * w[kGreen][kZ] + rl * w[kRed][kZ]) + bl * w[kBlue][kZ];
+    const double x = (gl * w[k_green][k_x] + rl * w[k_red][k_x]) + bl * w[k_blue][k_x];
+    const double y = (gl * w[k_green][k_y] + rl * w[k_red][k_y]) + bl * w[k_blue][k_y];
+    const double z = (gl * w[k_green][k_z] + rl * w[k_red][k_z]) + bl * w[k_blue][k_z];
     const double fx = cube_root(x);
     const double fy = cube_root(y);
     const double fz = cube_root(z);
@@ -139,9 +139,9 @@ LabFastTables build_lab_fast_tables() {
     for (int c = 0; c < 3; ++c) {
         for (int v = 0; v < 256; ++v) {
             const double level = linear[v];
-            t.x[c][v] = level * k_xyz_weights[c][kX] * k_index_scale;
-            t.y[c][v] = level * k_xyz_weights[c][kY] * k_index_scale;
-            t.z[c][v] = level * k_xyz_weights[c][kZ] * k_index_scale;
+            t.x[c][v] = level * k_xyz_weights[c][k_x] * k_index_scale;
+            t.y[c][v] = level * k_xyz_weights[c][k_y] * k_index_scale;
+            t.z[c][v] = level * k_xyz_weights[c][k_z] * k_index_scale;
         }
     }
     for (int i = 0; i < k_cbrt_entries; ++i) {
@@ -182,9 +182,9 @@ inline double lab_compand_scaled(double t, const double* cbrt) {
 inline void rgb_to_lab_fast(std::uint8_t* p, const LabFastTables& t) {
     const int r = p[0], g = p[1], b = p[2];
     // The formula's order: green's product first, then red's, then blue's.
-    const double x = (t.x[kGreen][g] + t.x[kRed][r]) + t.x[kBlue][b];
-    const double y = (t.y[kGreen][g] + t.y[kRed][r]) + t.y[kBlue][b];
-    const double z = (t.z[kGreen][g] + t.z[kRed][r]) + t.z[kBlue][b];
+    const double x = (t.x[k_green][g] + t.x[k_red][r]) + t.x[k_blue][b];
+    const double y = (t.y[k_green][g] + t.y[k_red][r]) + t.y[k_blue][b];
+    const double z = (t.z[k_green][g] + t.z[k_red][r]) + t.z[k_blue][b];
     const std::ptrdiff_t ix = cbrt_index(x), iy = cbrt_index(y), iz = cbrt_index(z);
     double fx, fy, fz;
     // Photos are mostly brighter than the linear segment. An index of at
