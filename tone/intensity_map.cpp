@@ -38,9 +38,12 @@ void intensity_map_by_table(VorBitmap* bitmap, const VorHistMap& map, color::Cha
         if (level_rows[0] == nullptr) {
             for (int c = 0; c < 3; ++c) level_rows[c] = table.row(map.map[c][level]);
         }
-        p[0] = level_rows[0][p[0]];
-        p[1] = level_rows[1][p[1]];
-        p[2] = level_rows[2][p[2]];
+        // All three read before any is stored: the table lies apart from the
+        // bitmap, and the stores then merge.
+        const std::uint8_t r = level_rows[0][p[0]], g = level_rows[1][p[1]], b = level_rows[2][p[2]];
+        p[0] = r;
+        p[1] = g;
+        p[2] = b;
     });
 }
 
