@@ -8,9 +8,7 @@
 
 extern "C" {
 
-VORLITE_PENDING_PROCESSOR(VLPLRunVignetteProcessor)
 VORLITE_PENDING_PROCESSOR(VLPLRunLegacyProcessor)
 VORLITE_PENDING_PROCESSOR(VLPLRunFlareProcessor)
-VORLITE_PENDING_PROCESSOR(VLPLRunGradientProcessor)
 
 }  // extern "C"

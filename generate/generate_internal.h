@@ -1,0 +1,116 @@
+// Internal helpers of the generated effects shared between their files.
+#ifndef VORLITE_GENERATE_INTERNAL_H
+#define VORLITE_GENERATE_INTERNAL_H
+
+#include <cmath>
+#include <cstdint>
+
+#include "core/core_internal.h"
+#include "zentra_vorlite.h"
+
+namespace vorlite::generate {
+
+// The vignette's ramp, shared by the plain vignette and the gradient's
+// vignette shape. t is the squared distance from the centre over the
+// squared radius, scaled so that t = 1.15 falls exactly on the radius:
+// q = r^2 x 0.8695652, one unit in the last place above the float nearest
+// 1/1.15, so that the ramp ends just inside the radius even when r is large.
+inline constexpr float k_vignette_radius_factor = core::float_bits(0x3F5E9BD4u);
+inline constexpr float k_vignette_full = core::float_bits(0x3F933333u);   // 1.15
+inline constexpr float k_vignette_start = core::float_bits(0x3D23D70Au);  // 0.04
+
+// 1 / (r^2 x 0.8695652), or 1e8 for a zero radius (every pixel but the
+// centre then lies beyond the ramp).
+inline float vignette_scale(double vignette_scale) {
+    const float r = static_cast<float>(vignette_scale);
+    const float q = r * r * k_vignette_radius_factor;
+    return q == 0.0f ? 1e8f : 1.0f / q;
+}
+
+// Sharper modes bend t before the ramp reads it: the ramp then starts
+// later and ends more abruptly.
+inline float shape_vignette(float t, std::int32_t shape_mode) {
+    switch (shape_mode) {
+        case VOR_SHAPE_SHARP:
+            return t * t;
+        case VOR_SHAPE_MEDIUM_SHARP:
+            return static_cast<float>(std::sqrt(static_cast<double>(t)) * static_cast<double>(t));
+        case VOR_SHAPE_ULTRA_SHARP: {
+            const float square = t * t;
+            return square * square;
+        }
+        default:
+            return t;
+    }
+}
+
+// The ramp between t = 0.04 and 1.15: a quintic in u = t^2 rising from
+// about 0.003 to about 0.92, evaluated in float in this exact order.
+inline float vignette_ramp(float t) {
+    const float u = t * t;
+    const float u2 = u * u;
+    const float u3 = u2 * u;
+    const float u4 = u3 * u;
+    const float u5 = u4 * u;
+    const float p = (((core::float_bits(0x3FD55555u) * u2 - 2.0f * u) + core::float_bits(0x3E534D35u) * u4) -
+                     core::float_bits(0x3F416C17u) * u3) -
+                    core::float_bits(0x3D148670u) * u5;
+    return -p;
+}
+
+// The centre offset of a vignette: dx of half the width (or dy of half
+// the height), rounded to a whole pixel. Held within +-2^30 so that the
+// squared distances stay exact in 64 bits for any document.
+inline std::int64_t vignette_offset(std::uint32_t size, double fraction) {
+    const double offset = std::floor(static_cast<double>(size / 2) * fraction + 0.5);
+    constexpr double limit = 1073741824.0;
+    if (!(offset > -limit)) return offset != offset ? 0 : -static_cast<std::int64_t>(limit);
+    if (offset > limit) return static_cast<std::int64_t>(limit);
+    return static_cast<std::int64_t>(offset);
+}
+
+// The vignette measured with x and y normalised by the bitmap's width and
+// height, so that the ramp is an ellipse of the bitmap's proportions.
+class StretchedVignette {
+public:
+    StretchedVignette(std::uint32_t width, std::uint32_t height, double vignette_scale_value,
+                      std::int32_t shape_mode, double dx, double dy)
+        : k_(vignette_scale(vignette_scale_value)),
+          shape_mode_(shape_mode),
+          cx_(static_cast<std::int64_t>(width / 2) + vignette_offset(width, dx)),
+          cy_(static_cast<std::int64_t>(height / 2) + vignette_offset(height, dy)) {
+        const float w = static_cast<float>(width);
+        const float h = static_cast<float>(height);
+        iw_ = 1.0f / (w * w);
+        ih_ = 1.0f / (h * h);
+    }
+
+    // t at a pixel, shaped by the mode.
+    float t(std::int64_t x, std::int64_t y) const {
+        const std::int64_t ex = x - cx_;
+        const std::int64_t ey = y - cy_;
+        const float t = (static_cast<float>(ex * ex) * iw_ + static_cast<float>(ey * ey) * ih_) * k_;
+        return shape_vignette(t, shape_mode_);
+    }
+
+    // The share of the effect at a pixel: 0 near the centre, the ramp, 1
+    // beyond the radius.
+    float weight(std::int64_t x, std::int64_t y) const {
+        const float shaped = t(x, y);
+        if (shaped > k_vignette_full) return 1.0f;
+        if (shaped < k_vignette_start) return 0.0f;
+        return vignette_ramp(shaped);
+    }
+
+private:
+    float k_;
+    std::int32_t shape_mode_;
+    std::int64_t cx_;
+    std::int64_t cy_;
+    float iw_ = 0.0f;
+    float ih_ = 0.0f;
+};
+
+}  // namespace vorlite::generate
+
+#endif

@@ -1,0 +1,408 @@
+// Colour gradients with their own opacity ramp, sampled once into a
+// 1024-entry table and laid over a bitmap in three shapes (linear at an
+// angle, radial, linear weighted by a vignette); the JSON form of the stops
+// and the "gradient" processor.
+#include <cmath>
+#include <cstddef>
+#include <cstdlib>
+#include <cstring>
+
+#include "color/color_internal.h"
+#include "core/core_internal.h"
+#include "generate/generate_internal.h"
+#include "proclist/proclist_internal.h"
+
+namespace {
+
+using vorlite::core::WorkingArray;
+
+// A stop count whose byte size would pass 32 bits.
+constexpr std::uint32_t k_stop_limit = 0x10000000u;
+constexpr std::uint32_t k_table_size = 1024;
+constexpr double k_two_pi = 6.283185307179586;
+// 1/255 in double: the ease adds at most a few levels' worth of s-curve.
+constexpr double k_ease_scale = 0.00392156862745098;
+constexpr double k_degrees_to_radians = 0.017453292519943295;
+
+// A stop can be interpolated once the gradient has two of each kind and
+// its opacity ramp, measured on the colour stops' locations, finds a colour
+// stop for every opacity stop.
+bool drawable(const VorGradient& gradient) {
+    return gradient.colorStops != nullptr && gradient.opacityStops != nullptr &&
+           gradient.colorStopCount >= 2 && gradient.opacityStopCount >= 2 &&
+           gradient.opacityStopCount <= gradient.colorStopCount;
+}
+
+// The span between the lower and the upper stop that holds p; both passes
+// move forward only, since p grows with the entry index. The last stop is
+// never the lower one.
+struct Span {
+    std::uint32_t lower = 0;
+    std::uint32_t upper = 1;
+
+    template <typename Location>
+    void advance(double p, std::uint32_t count, Location location) {
+        while (location(upper) <= p && upper + 1 < count) {
+            lower = upper;
+            ++upper;
+        }
+    }
+};
+
+double clamp_unit(double t) {
+    if (t < 0.0) return 0.0;
+    if (t > 1.0) return 1.0;
+    return t;
+}
+
+// A gentle s-curve over each span, so that colours linger near their stops
+// and the middle of a span moves faster, by up to about 12 levels.
+double ease(double t) {
+    const double s = t - 0.5;
+    const double a = (1.5 * std::fabs(s) + 1.0) * 9.0;
+    return clamp_unit(t + a * vorlite::core::sin(k_two_pi * s) * k_ease_scale);
+}
+
+// 255 above the range, truncation within it; below it and NaN give 0.
+std::uint8_t gradient_byte(double c) {
+    if (c > 255.0) return 255;
+    if (!(c > 0.0)) return 0;
+    return static_cast<std::uint8_t>(c);
+}
+
+double position_of_entry(std::uint32_t i, std::uint32_t n) {
+    const double step = 1.0 / static_cast<double>(n - 1);
+    return (1.0 - static_cast<double>(n - 1 - i) * step) * 100.0;
+}
+
+void sample_colours(const VorGradient& gradient, VorColor* table, std::uint32_t n) {
+    const VorGradientColorStop* stops = gradient.colorStops;
+    Span span;
+    for (std::uint32_t i = 0; i < n; ++i) {
+        const double p = position_of_entry(i, n);
+        span.advance(p, gradient.colorStopCount, [&](std::uint32_t k) { return stops[k].location; });
+        const VorGradientColorStop& lo = stops[span.lower];
+        const VorGradientColorStop& hi = stops[span.upper];
+        const double t = ease(clamp_unit((p - lo.location) / (hi.location - lo.location)));
+        const auto mix = [&](std::uint8_t a, std::uint8_t b) {
+            return gradient_byte((1.0 - t) * static_cast<double>(a) + t * static_cast<double>(b));
+        };
+        table[i].r = mix(lo.color.r, hi.color.r);
+        table[i].g = mix(lo.color.g, hi.color.g);
+        table[i].b = mix(lo.color.b, hi.color.b);
+    }
+}
+
+// The opacity ramp's spans end at the colour stop of the upper index, not
+// at the opacity stop: an opacity ramp is laid out on the colour ramp.
+void sample_opacities(const VorGradient& gradient, VorColor* table, std::uint32_t n) {
+    const VorGradientOpacityStop* stops = gradient.opacityStops;
+    const VorGradientColorStop* colours = gradient.colorStops;
+    Span span;
+    for (std::uint32_t i = 0; i < n; ++i) {
+        const double p = position_of_entry(i, n);
+        span.advance(p, gradient.opacityStopCount, [&](std::uint32_t k) { return stops[k].location; });
+        const VorGradientOpacityStop& lo = stops[span.lower];
+        const VorGradientOpacityStop& hi = stops[span.upper];
+        const double end = colours[span.upper].location;
+        const double t = ease(clamp_unit((p - lo.location) / (end - lo.location)));
+        table[i].a = gradient_byte(((1.0 - t) * lo.opacity + t * hi.opacity) * 255.0);
+    }
+}
+
+// The table index of a gradient coordinate, rounded to float and held in
+// 0..1 (NaN, from a degenerate shape, reads the first entry).
+std::uint32_t table_index(double coordinate) {
+    float g = static_cast<float>(coordinate);
+    if (!(g > 0.0f)) g = 0.0f;
+    if (g > 1.0f) g = 1.0f;
+    return static_cast<std::uint32_t>(std::floor(static_cast<double>(g * 1023.0f) + 0.5));
+}
+
+// Every mode but the colour mode blends each channel on its own, and a
+// linear or radial gradient's opacity depends on the table entry alone: so
+// each entry's three channel rows are filled once, when a pixel first
+// needs them, and a pixel costs three lookups instead of a blend.
+class EntryRows {
+public:
+    bool build() { return rows_.build(k_table_size * 3, 256) && filled_.build(k_table_size); }
+    const std::uint8_t* rows(std::uint32_t index, const VorColor& entry, std::uint32_t mode, float opacity) {
+        std::uint8_t* r = &rows_[std::size_t{index} * 768];
+        if (!filled_[index]) {
+            filled_[index] = 1;
+            vorlite::color::blend_channel_row(mode, entry.r, opacity, r);
+            vorlite::color::blend_channel_row(mode, entry.g, opacity, r + 256);
+            vorlite::color::blend_channel_row(mode, entry.b, opacity, r + 512);
+        }
+        return r;
+    }
+
+private:
+    WorkingArray<std::uint8_t> rows_;
+    WorkingArray<std::uint8_t> filled_;
+};
+
+// The pixel's place along the gradient: its offset from the origin in
+// units of the gradient's length, projected on the angle or measured as a
+// distance.
+struct Coordinates {
+    double inv;
+    double sa;
+    double ca;
+    double inv_width;
+    double inv_height;
+    bool radial;
+
+    double row(std::uint32_t y, double y_center) const {
+        return (static_cast<double>(y) * inv_height - y_center) * inv;
+    }
+    double at(std::uint32_t x, double v, double x_center) const {
+        const double u = (static_cast<double>(x) * inv_width - x_center) * inv;
+        return radial ? std::sqrt(v * v + u * u) : u * ca - v * sa;
+    }
+};
+
+float entry_opacity(double opacity, const VorColor& entry) {
+    return static_cast<float>(opacity * static_cast<double>(entry.a * vorlite::core::k_inv255));
+}
+
+void blend_pixel(std::uint8_t* p, const VorColor& entry, std::uint32_t mode, float opacity) {
+    VorColor out = vorlite::core::load_pixel(p);
+    VorColorBlend(&out, &entry, mode, opacity);
+    vorlite::core::store_pixel(p, out);
+}
+
+void draw_plain(VorBitmap* bitmap, const VorGradientShapeParams& params, const Coordinates& c,
+                const VorColor* table, std::uint32_t mode, double opacity) {
+    EntryRows rows;
+    const bool by_rows = mode != VOR_BLEND_COLOR && rows.build();
+    std::uint8_t* p = bitmap->data;
+    for (std::uint32_t y = 0; y < bitmap->height; ++y) {
+        const double v = c.row(y, params.yCenter);
+        for (std::uint32_t x = 0; x < bitmap->width; ++x, p += 4) {
+            const std::uint32_t index = table_index(c.at(x, v, params.xCenter));
+            const VorColor& entry = table[index];
+            if (by_rows) {
+                const std::uint8_t* r = rows.rows(index, entry, mode, entry_opacity(opacity, entry));
+                p[0] = r[p[0]];
+                p[1] = r[256 + p[1]];
+                p[2] = r[512 + p[2]];
+            } else {
+                blend_pixel(p, entry, mode, entry_opacity(opacity, entry));
+            }
+        }
+    }
+}
+
+// Linear, each pixel's opacity further weighted by a stretched vignette:
+// the weight changes from pixel to pixel, so every pixel is blended.
+void draw_vignetted(VorBitmap* bitmap, const VorGradientShapeParams& params, const Coordinates& c,
+                    const VorColor* table, std::uint32_t mode, double opacity) {
+    const vorlite::generate::StretchedVignette vignette(bitmap->width, bitmap->height, params.vignetteScale,
+                                                        params.shapeMode, params.dx, params.dy);
+    std::uint8_t* p = bitmap->data;
+    for (std::uint32_t y = 0; y < bitmap->height; ++y) {
+        const double v = c.row(y, params.yCenter);
+        for (std::uint32_t x = 0; x < bitmap->width; ++x, p += 4) {
+            const VorColor& entry = table[table_index(c.at(x, v, params.xCenter))];
+            const double weighted = opacity * static_cast<double>(entry.a * vorlite::core::k_inv255) *
+                                    static_cast<double>(vignette.weight(x, y));
+            blend_pixel(p, entry, mode, static_cast<float>(weighted));
+        }
+    }
+}
+
+void draw(VorBitmap* bitmap, const VorGradientShapeParams& params, const VorColor* table,
+          std::uint32_t mode, double opacity) {
+    const Coordinates c{1.0 / params.scale,
+                        vorlite::core::sin(params.angle),
+                        vorlite::core::cos(params.angle),
+                        1.0 / static_cast<double>(bitmap->width),
+                        1.0 / static_cast<double>(bitmap->height),
+                        params.shape == VOR_GRADIENT_RADIAL};
+    if (params.shape == VOR_GRADIENT_LINEAR_VIGNETTE) {
+        draw_vignetted(bitmap, params, c, table, mode, opacity);
+    } else {
+        draw_plain(bitmap, params, c, table, mode, opacity);
+    }
+}
+
+// The stop members of one JSON element: numbers rounded through float.
+bool location_of(yajl_val element, double* location) {
+    double value = 0.0;
+    if (!vorlite::proclist::member_double(element, "location", &value)) return false;
+    *location = static_cast<double>(static_cast<float>(value));
+    return true;
+}
+
+std::uint32_t element_count(yajl_val array, std::uint32_t stops) {
+    const std::size_t len = YAJL_GET_ARRAY(array)->len;
+    return len < stops ? static_cast<std::uint32_t>(len) : stops;
+}
+
+bool shape_from_name(yajl_val value, std::int32_t* shape) {
+    const char* name = YAJL_GET_STRING(value);
+    if (name == nullptr) return false;
+    if (std::strcmp(name, "linear") == 0) {
+        *shape = VOR_GRADIENT_LINEAR;
+    } else if (std::strcmp(name, "radial") == 0) {
+        *shape = VOR_GRADIENT_RADIAL;
+    } else if (std::strcmp(name, "linearVignette") == 0) {
+        *shape = VOR_GRADIENT_LINEAR_VIGNETTE;
+    } else {
+        return false;
+    }
+    return true;
+}
+
+// The gradient's storage, released on every path of the processor.
+struct OwnedGradient {
+    VorGradient gradient{nullptr, nullptr, 0, 0};
+    ~OwnedGradient() { VorGradientFree(&gradient); }
+};
+
+}  // namespace
+
+extern "C" {
+
+VOR_API int VorGradientBuild(VorGradient* gradient, uint32_t colorStopCount,
+                             uint32_t opacityStopCount) {
+    gradient->colorStopCount = colorStopCount;
+    gradient->opacityStopCount = opacityStopCount;
+    gradient->colorStops = nullptr;
+    gradient->opacityStops = nullptr;
+    if (colorStopCount >= k_stop_limit || opacityStopCount >= k_stop_limit) return 0;
+    void* colours = nullptr;
+    void* opacities = nullptr;
+    if (!VorArrayBuild(&colours, colorStopCount, sizeof(VorGradientColorStop)) ||
+        !VorArrayBuild(&opacities, opacityStopCount, sizeof(VorGradientOpacityStop))) {
+        VorArrayFree(&colours);
+        VorArrayFree(&opacities);
+        return 0;
+    }
+    gradient->colorStops = static_cast<VorGradientColorStop*>(colours);
+    gradient->opacityStops = static_cast<VorGradientOpacityStop*>(opacities);
+    return 1;
+}
+
+VOR_API void VorGradientFree(VorGradient* gradient) {
+    std::free(gradient->colorStops);
+    std::free(gradient->opacityStops);
+    gradient->colorStops = nullptr;
+    gradient->opacityStops = nullptr;
+}
+
+VOR_API void VorGradientShapeParamsInit(VorGradientShapeParams* params) {
+    params->shape = VOR_GRADIENT_LINEAR;
+    params->scale = 1.0;
+    params->xCenter = 0.5;
+    params->yCenter = 0.5;
+    params->angle = 0.0;
+    params->shapeMode = VOR_SHAPE_NORMAL;
+    params->vignetteScale = 1.0;
+    params->dx = 0.0;
+    params->dy = 0.0;
+}
+
+VOR_API void VorGradientMemoize(const VorGradient* gradient, VorColor* table, uint32_t n) {
+    // One entry has no span to sample; a gradient without two stops of each
+    // kind has nothing to interpolate.
+    if (n < 2 || !drawable(*gradient)) return;
+    sample_colours(*gradient, table, n);
+    sample_opacities(*gradient, table, n);
+}
+
+VOR_API void VorGradientApply(VorBitmap* bitmap, const VorGradientShapeParams* params,
+                              const VorGradient* gradient, uint32_t blendMode, double opacity) {
+    if (params->scale == 0.0 || !drawable(*gradient)) return;
+    if (bitmap->width == 0 || bitmap->height == 0) return;
+    WorkingArray<VorColor> table;
+    if (!table.build(k_table_size)) return;
+    VorGradientMemoize(gradient, table.get(), k_table_size);
+    draw(bitmap, *params, table.get(), blendMode, opacity);
+}
+
+VOR_API int VLPLGradientfromColorsValAndOpacitiesVal(const yajl_val colors, const yajl_val opacities,
+                                                     VorGradient* gradient) {
+    using vorlite::proclist::member;
+    if (colors == nullptr || !YAJL_IS_ARRAY(colors)) return 0;
+    if (opacities == nullptr || !YAJL_IS_ARRAY(opacities)) return 0;
+    const std::uint32_t colour_count = element_count(colors, gradient->colorStopCount);
+    for (std::uint32_t i = 0; i < colour_count; ++i) {
+        const yajl_val element = YAJL_GET_ARRAY(colors)->values[i];
+        const yajl_val colour = member(element, "color", yajl_t_object);
+        double location = 0.0;
+        if (colour == nullptr || !location_of(element, &location)) return 0;
+        if (!VLPLColorFromColorVal(colour, &gradient->colorStops[i].color)) return 0;
+        gradient->colorStops[i].location = location;
+    }
+    const std::uint32_t opacity_count = element_count(opacities, gradient->opacityStopCount);
+    for (std::uint32_t i = 0; i < opacity_count; ++i) {
+        const yajl_val element = YAJL_GET_ARRAY(opacities)->values[i];
+        double opacity = 0.0;
+        double location = 0.0;
+        if (!vorlite::proclist::member_double(element, "opacity", &opacity) ||
+            !location_of(element, &location)) {
+            return 0;
+        }
+        gradient->opacityStops[i].opacity = static_cast<double>(static_cast<float>(opacity));
+        gradient->opacityStops[i].location = location;
+    }
+    return 1;
+}
+
+// "gradient": "colors" and "opacities" (stop arrays), "gradientShape"
+// ("linear", "radial", "linearVignette"), "scale", "xCenter", "yCenter",
+// "angle" (degrees) and "alpha" numbers, "vignetteShape" for the vignette
+// shape, "blendMode" optional. The strength scales the opacity.
+VOR_API int VLPLRunGradientProcessor(const yajl_val parameters, VorBitmap* bitmap,
+                                     const VLPLRunOptions* options) {
+    using vorlite::proclist::member;
+    using vorlite::proclist::member_double;
+    const yajl_val colors = member(parameters, "colors", yajl_t_array);
+    const yajl_val opacities = member(parameters, "opacities", yajl_t_array);
+    const yajl_val shape_name = member(parameters, "gradientShape", yajl_t_string);
+    const yajl_val vignette_shape = member(parameters, "vignetteShape", yajl_t_object);
+    double scale = 0.0, x_center = 0.0, y_center = 0.0, angle = 0.0;
+    vorlite::proclist::Layering layering;
+    if (colors == nullptr || opacities == nullptr || shape_name == nullptr ||
+        !member_double(parameters, "scale", &scale) || !member_double(parameters, "xCenter", &x_center) ||
+        !member_double(parameters, "yCenter", &y_center) || !member_double(parameters, "angle", &angle) ||
+        !vorlite::proclist::member_layering(parameters, &layering)) {
+        return 0;
+    }
+    OwnedGradient owned;
+    VorGradient& gradient = owned.gradient;
+    const std::size_t colour_stops = YAJL_GET_ARRAY(colors)->len;
+    const std::size_t opacity_stops = YAJL_GET_ARRAY(opacities)->len;
+    if (colour_stops >= k_stop_limit || opacity_stops >= k_stop_limit) return 0;
+    if (!VorGradientBuild(&gradient, static_cast<std::uint32_t>(colour_stops),
+                          static_cast<std::uint32_t>(opacity_stops)) ||
+        !VLPLGradientfromColorsValAndOpacitiesVal(colors, opacities, &gradient)) {
+        return 0;
+    }
+    // A document cannot make the sampler read past its stops: fewer than
+    // two of a kind, or more opacity than colour stops, is refused.
+    if (!drawable(gradient)) return 0;
+    VorGradientShapeParams shape;
+    VorGradientShapeParamsInit(&shape);
+    if (!shape_from_name(shape_name, &shape.shape)) return 0;
+    shape.scale = static_cast<float>(scale);
+    shape.xCenter = static_cast<float>(x_center);
+    shape.yCenter = static_cast<float>(y_center);
+    shape.angle = static_cast<float>(angle * k_degrees_to_radians);
+    if (shape.shape == VOR_GRADIENT_LINEAR_VIGNETTE) {
+        VorBorderParams border;
+        VorBorderInitParams(&border);
+        if (!VLPLBorderPopoulateWithShapeTypeVal(vignette_shape, &border, bitmap, 1.0f, 0)) return 0;
+        shape.shapeMode = border.shapeMode;
+        shape.vignetteScale = border.vignetteScale;
+        shape.dx = border.dx;
+        shape.dy = border.dy;
+    }
+    const double opacity = static_cast<float>(layering.alpha * options->strength);
+    VorGradientApply(bitmap, &shape, &gradient, layering.mode, opacity);
+    return 1;
+}
+
+}  // extern "C"

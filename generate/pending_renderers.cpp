@@ -1,0 +1,16 @@
+// Renderers whose designs are not part of this build yet: they draw
+// nothing, so the styles and flare types that reach them leave the picture
+// as it is. Each moves to a file of its own when its design lands.
+#include "core/core_internal.h"
+
+extern "C" {
+
+VOR_API void VorBordersSide(VorBitmap*, const VorBorderParams*) {}
+VOR_API void VorBordersDoubleSided(VorBitmap*, const VorBorderParams*) {}
+VOR_API void VorBordersInstant(VorBitmap*, const VorBorderParams*) {}
+VOR_API void VorFlare(VorBitmap*, float, const VorColor*, VorFlareType, float, float, float, float, uint32_t) {}
+VOR_API int VLPLFlareTypeFromFlareTypeVal(const yajl_val, VorFlareType*) { return 0; }
+VOR_API void VorFlareLegacyCorvale(VorBitmap*, const VLPLRunOptions*) {}
+VOR_API void VorFlareLegacyEmberly(VorBitmap*, const VLPLRunOptions*) {}
+
+}  // extern "C"

@@ -1,0 +1,107 @@
+// The vignette (border style 15): the colour laid over the picture with a
+// smooth ramp from a clear centre to full strength beyond the radius; and
+// the "vignette" processor.
+#include "core/core_internal.h"
+#include "generate/generate_internal.h"
+#include "proclist/proclist_internal.h"
+
+namespace {
+
+using vorlite::generate::k_vignette_full;
+using vorlite::generate::k_vignette_start;
+
+// Squared distance from the centre on the vignette's scale: in pixels, or
+// with x and y normalised by the bitmap's width and height (an ellipse of
+// the picture's proportions).
+struct Distance {
+    bool stretch;
+    float k;
+    float iw;
+    float ih;
+
+    float operator()(std::int64_t ex, std::int64_t ey) const {
+        if (stretch) return (static_cast<float>(ex * ex) * iw + static_cast<float>(ey * ey) * ih) * k;
+        return static_cast<float>(ex * ex + ey * ey) * k;
+    }
+};
+
+// The ramp's opacity level for the memoized blend.
+std::uint32_t ramp_level(float t, std::uint8_t alpha) {
+    const auto level = vorlite::core::truncate_clamped<std::int32_t>(
+        vorlite::generate::vignette_ramp(t) * static_cast<float>(alpha));
+    return static_cast<std::uint32_t>(vorlite::core::clamp_byte(level));
+}
+
+}  // namespace
+
+extern "C" {
+
+VOR_API void VorVignette(VorBitmap* bitmap, const VorBorderParams* params) {
+    const std::uint32_t width = bitmap->width;
+    const std::uint32_t height = bitmap->height;
+    if (width == 0 || height < 1) return;
+    vorlite::core::WorkingArray<VorColorBlendMemoTable> memo;
+    if (!memo.build(1)) return;
+    const auto mode = static_cast<std::uint32_t>(params->blendMode);
+    VorColorBlendInitMemozied(memo.get(), mode);
+    const float w = static_cast<float>(width);
+    const float h = static_cast<float>(height);
+    const Distance distance{params->stretch != 0, vorlite::generate::vignette_scale(params->vignetteScale),
+                            1.0f / (w * w), 1.0f / (h * h)};
+    const std::int64_t cx = static_cast<std::int64_t>(width / 2) + vorlite::generate::vignette_offset(width, params->dx);
+    const std::int64_t cy =
+        static_cast<std::int64_t>(height / 2) + vorlite::generate::vignette_offset(height, params->dy);
+    const VorColor colour = params->color;
+    const float full_opacity = static_cast<float>(colour.a) * vorlite::core::k_inv255;
+    // The memo's level colour.a is that very opacity, and every mode but the
+    // colour mode blends channel by channel, so the memo gives the direct
+    // blend's bytes beyond the radius too.
+    const bool memo_at_full = mode != VOR_BLEND_COLOR;
+    std::uint8_t* p = bitmap->data;
+    for (std::uint32_t y = 0; y < height; ++y) {
+        const std::int64_t ey = static_cast<std::int64_t>(y) - cy;
+        for (std::uint32_t x = 0; x < width; ++x, p += 4) {
+            const float t = vorlite::generate::shape_vignette(distance(static_cast<std::int64_t>(x) - cx, ey),
+                                                              params->shapeMode);
+            if (!(t >= k_vignette_start)) continue;
+            VorColor out = vorlite::core::load_pixel(p);
+            if (t > k_vignette_full) {
+                if (memo_at_full) {
+                    VorColorBlendMemoized(&out, &colour, colour.a, memo.get());
+                } else {
+                    VorColorBlend(&out, &colour, mode, full_opacity);
+                }
+            } else {
+                VorColorBlendMemoized(&out, &colour, ramp_level(t, colour.a), memo.get());
+            }
+            vorlite::core::store_pixel(p, out);
+        }
+    }
+}
+
+// "vignette": "color" (colour), "shape" (the vignette's shape object),
+// "blendMode" optional. The strength divides the radius.
+VOR_API int VLPLRunVignetteProcessor(const yajl_val parameters, VorBitmap* bitmap,
+                                     const VLPLRunOptions* options) {
+    using vorlite::proclist::member;
+    if (parameters == nullptr || !YAJL_IS_OBJECT(parameters)) return 0;
+    const yajl_val colour_value = member(parameters, "color", yajl_t_object);
+    const yajl_val shape = member(parameters, "shape", yajl_t_object);
+    if (colour_value == nullptr || shape == nullptr) return 0;
+    int mode = 0;
+    VorColor colour;
+    VLPLBlendModeFromBlendModeVal(member(parameters, "blendMode", yajl_t_any), &mode);
+    if (!VLPLColorFromColorVal(colour_value, &colour)) return 0;
+    VorBorderParams border;
+    VorBorderInitParams(&border);
+    border.style = VOR_BORDER_VIGNETTE;
+    border.color = colour;
+    border.blendMode = mode;
+    if (!VLPLBorderPopoulateWithShapeTypeVal(shape, &border, bitmap, static_cast<float>(options->strength), 1)) {
+        return 0;
+    }
+    VorBorders(bitmap, &border);
+    return 1;
+}
+
+}  // extern "C"
