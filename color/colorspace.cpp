@@ -1,6 +1,5 @@
 // Conversions between sRGB pixels and CIE L*a*b* (D65), HSV and HSL, and
 // the in-place conversion of whole bitmaps to packed L*a*b* and back.
-#include <math.h>
 #include <stdio.h>
 
 #include <cstddef>
@@ -23,7 +22,7 @@ void fill_linear_table(float table[256]) {
             // double and only then narrowed for the single-precision power.
             const float base =
                 static_cast<float>((static_cast<double>(c) + 0.055) * 0.9478672985781991);
-            table[v] = ::powf(base, 2.4f) * 100.0f;
+            table[v] = vorlite::core::powf(base, 2.4f) * 100.0f;
         } else {
             table[v] = static_cast<float>(100 * v) * 0.000303527f;
         }
@@ -33,7 +32,7 @@ void fill_linear_table(float table[256]) {
 void fill_cbrt_table(float table[1024]) {
     table[0] = 0.0f;
     for (int i = 1; i < 1024; ++i) {
-        table[i] = static_cast<float>(::pow(i * (1.0 / 1023.0), 0.3333333333333333));
+        table[i] = static_cast<float>(vorlite::core::pow(i * (1.0 / 1023.0), 0.3333333333333333));
     }
 }
 
@@ -41,7 +40,7 @@ void fill_cbrt_table(float table[1024]) {
 void fill_encoding_table(float table[1024]) {
     for (int i = 0; i < 1024; ++i) {
         const double t = i / 1023.0;
-        const double e = t <= 0.0031308 ? 12.92 * t : 1.055 * ::pow(t, 1.0 / 2.4) - 0.055;
+        const double e = t <= 0.0031308 ? 12.92 * t : 1.055 * vorlite::core::pow(t, 1.0 / 2.4) - 0.055;
         table[i] = static_cast<float>(e);
     }
 }
@@ -53,7 +52,7 @@ constexpr double k_lab_epsilon = 0.008856;
 inline double lab_linear_segment(double t) { return 7.787 * t + 0.13793103448275862; }
 
 inline double cbrt_exact(double t) {
-    if (t > k_lab_epsilon) return static_cast<double>(::powf(static_cast<float>(t), 0.33333334f));
+    if (t > k_lab_epsilon) return static_cast<double>(vorlite::core::powf(static_cast<float>(t), 0.33333334f));
     return lab_linear_segment(t);
 }
 

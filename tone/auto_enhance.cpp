@@ -2,8 +2,6 @@
 // from the luminance-weighted cumulative histogram and smoothed, applied to
 // green directly and to red and blue partly multiplicatively and partly
 // through green's change.
-#include <math.h>
-
 #include <array>
 
 #include "core/core_internal.h"
@@ -42,11 +40,11 @@ Levels neutral_levels(const VorCDF& cdf) {
 // at or below the level than an even spread of levels would put there.
 float gain_of_ratio(double ratio, int level, int mode) {
     const float r = static_cast<float>(ratio);
-    if (mode == 0) return ::powf(r, 0.8f);
-    if (mode == 2) return ratio > 1.0 ? ::powf(r, 0.65f) : 1.0f;
+    if (mode == 0) return vorlite::core::powf(r, 0.8f);
+    if (mode == 2) return ratio > 1.0 ? vorlite::core::powf(r, 0.65f) : 1.0f;
     // The exponent shrinks toward white, so highlights are lifted least.
     const float shade = 1.0f - static_cast<float>(level) * vorlite::core::k_inv255;
-    return ::powf(r, 0.5f * ::powf(shade, 2.2f));
+    return vorlite::core::powf(r, 0.5f * vorlite::core::powf(shade, 2.2f));
 }
 
 // Gains from the luminance-weighted running total of the three channel

@@ -2,8 +2,6 @@
 // green histogram is applied not pixel by pixel but through box means of
 // grey levels, so each pixel takes on the brightness change of its
 // neighbourhood while keeping, slightly amplified, its own detail.
-#include <math.h>
-
 #include "core/core_internal.h"
 #include "tone/tone_internal.h"
 
@@ -79,7 +77,7 @@ void green_gains(const VorHistogram& histogram, std::uint32_t pixels, float gain
             continue;
         }
         const float ratio = share / (static_cast<float>(i) * vorlite::core::k_inv255);
-        gains[i] = ratio > 1.0f ? ::powf(ratio, 0.33f) : 1.0f;
+        gains[i] = ratio > 1.0f ? vorlite::core::powf(ratio, 0.33f) : 1.0f;
     }
 }
 

@@ -1,8 +1,6 @@
 // Fixed-shape tone curves: the contrast S-curve and the gamma power curve,
 // each built once as a 256-level map and applied through the histogram
 // transform; and the "contrast" and "gamma" processors.
-#include <math.h>
-
 #include "core/core_internal.h"
 #include "proclist/proclist_internal.h"
 
@@ -28,9 +26,9 @@ vorlite::core::Curve contrast_curve(float contrast) {
     for (int i = 0; i < 256; ++i) {
         float y;
         if (i <= 127) {
-            y = ::powf(static_cast<float>(i) * s, c) * 127.0f + 0.5f;
+            y = vorlite::core::powf(static_cast<float>(i) * s, c) * 127.0f + 0.5f;
         } else {
-            y = (::powf(static_cast<float>(i - 128) * s, k) + 1.0f) * 127.0f + 0.5f;
+            y = (vorlite::core::powf(static_cast<float>(i - 128) * s, k) + 1.0f) * 127.0f + 0.5f;
         }
         curve[i] = curve_level(y);
     }
@@ -41,7 +39,7 @@ vorlite::core::Curve gamma_curve(float gamma) {
     const float s = 1.0f / 255.0f;
     vorlite::core::Curve curve;
     for (int i = 0; i < 256; ++i) {
-        curve[i] = curve_level(::powf(static_cast<float>(i) * s, gamma) * 255.0f + 0.5f);
+        curve[i] = curve_level(vorlite::core::powf(static_cast<float>(i) * s, gamma) * 255.0f + 0.5f);
     }
     return curve;
 }

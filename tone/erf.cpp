@@ -2,8 +2,6 @@
 // a 28-term Chebyshev expansion of erfc, run in single precision with
 // only the final exponential in double, so every kernel weight is the
 // same on each platform.
-#include <math.h>
-
 #include <array>
 
 #include "core/core_internal.h"
@@ -47,7 +45,7 @@ VOR_API float VorMathErfccheb(float z) {
     const double exponent =
         (static_cast<double>(minus_z_squared) - static_cast<double>(dd)) +
         0.5 * static_cast<double>(last);
-    return static_cast<float>(static_cast<double>(t) * ::exp(exponent));
+    return static_cast<float>(static_cast<double>(t) * vorlite::core::exp(exponent));
 }
 
 VOR_API float VorMathErf(float x) {

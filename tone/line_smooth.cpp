@@ -1,8 +1,6 @@
 // Gaussian smoothing of a line of floats, the kernel spanning the whole
 // line: it smooths the 256 per-level gains of local contrast and auto
 // enhance, where the ends of the line matter as much as the middle.
-#include <math.h>
-
 #include "core/core_internal.h"
 
 extern "C" {
@@ -20,7 +18,7 @@ VOR_API void VorLineSmooth1D(float* values, uint32_t n, int32_t sigma) {
     // exponential is computed once; the sums below use the very same values.
     for (std::uint32_t d = 0; d < n; ++d) {
         const auto exponent = static_cast<std::int32_t>(0u - d * d);
-        weight[d] = ::expf(static_cast<float>(exponent) * k);
+        weight[d] = vorlite::core::expf(static_cast<float>(exponent) * k);
     }
     for (std::uint32_t i = 0; i < n; ++i) {
         float num = 0.0f;

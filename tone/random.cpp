@@ -2,7 +2,7 @@
 // generator that the caller seeds, with uniform, normal and Laplace draws.
 // Every seeded effect replays this exact sequence, so each conversion and
 // draw order below is part of the observable behaviour.
-#include <math.h>
+#include <cmath>
 #include <stdlib.h>
 
 #include "core/core_internal.h"
@@ -52,17 +52,17 @@ VOR_API float VorRNGNextFloatNormal(VorRNG* rng) {
     float u2 = VorRNGNextFloat(rng);
     while (u1 == 0.0f) u1 = VorRNGNextFloat(rng);
     while (u2 == 0.0f) u2 = VorRNGNextFloat(rng);
-    const float radius = ::sqrtf(::logf(u1) * -2.0f);
+    const float radius = std::sqrt(vorlite::core::logf(u1) * -2.0f);
     const float theta = static_cast<float>(static_cast<double>(u2) * 6.283185307179586);
-    return ::cosf(theta) * radius;
+    return vorlite::core::cosf(theta) * radius;
 }
 
 VOR_API float VorRNGNextFloatLaplace(VorRNG* rng) {
     // Inverse distribution of the unit Laplace law on d in [-0.5, 0.5];
     // a draw of exactly 0 gives +infinity.
     const float d = 0.5f - VorRNGNextFloat(rng);
-    if (d < 0.0f) return ::logf(d + d + 1.0f);
-    return -::logf(1.0f - (d + d));
+    if (d < 0.0f) return vorlite::core::logf(d + d + 1.0f);
+    return -vorlite::core::logf(1.0f - (d + d));
 }
 
 }  // extern "C"
