@@ -111,6 +111,20 @@ private:
     float ih_ = 0.0f;
 };
 
+// Flares: the per-row terms of a flare's shape coordinates, formed once a
+// row: y, y - 1 and (y - 1)^2.
+struct FlareRow {
+    float y;
+    float y_minus_1;
+    float y_minus_1_squared;
+};
+
+// Flares: the transmission (1 = no light, 0 = the full colour) of the
+// shapes built from angles, lobes and crossed Gaussians, at shape
+// coordinates (x, row.y) with r = x^2 + y^2, for the colour's opacity a;
+// exponents below limit, ln(1/alpha), are below one level of light.
+float designed_flare_transmission(VorFlareType type, float x, const FlareRow& row, float r, float a, float limit);
+
 }  // namespace vorlite::generate
 
 #endif

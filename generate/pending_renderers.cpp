@@ -8,8 +8,6 @@ extern "C" {
 VOR_API void VorBordersSide(VorBitmap*, const VorBorderParams*) {}
 VOR_API void VorBordersDoubleSided(VorBitmap*, const VorBorderParams*) {}
 VOR_API void VorBordersInstant(VorBitmap*, const VorBorderParams*) {}
-VOR_API void VorFlare(VorBitmap*, float, const VorColor*, VorFlareType, float, float, float, float, uint32_t) {}
-VOR_API int VLPLFlareTypeFromFlareTypeVal(const yajl_val, VorFlareType*) { return 0; }
 VOR_API void VorFlareLegacyCorvale(VorBitmap*, const VLPLRunOptions*) {}
 VOR_API void VorFlareLegacyEmberly(VorBitmap*, const VLPLRunOptions*) {}
 

@@ -9,6 +9,5 @@
 extern "C" {
 
 VORLITE_PENDING_PROCESSOR(VLPLRunLegacyProcessor)
-VORLITE_PENDING_PROCESSOR(VLPLRunFlareProcessor)
 
 }  // extern "C"
