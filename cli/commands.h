@@ -52,11 +52,18 @@ struct BatchArgs {
     int quality = kDefaultQuality;
 };
 
+// Contact sheets of every border style, flare type and gradient shape.
+struct GalleryArgs {
+    std::filesystem::path output_dir;
+    std::optional<std::filesystem::path> photo;  // a built-in scene when absent
+};
+
 int run_apply(const ApplyArgs& args);
 int run_check(const std::filesystem::path& effect);
 int run_adjust(const AdjustArgs& args);
 int run_auto(const AutoArgs& args);
 int run_batch(const BatchArgs& args);
 int run_info();
+int run_gallery(const GalleryArgs& args);
 
 }  // namespace vorlite::cli

@@ -117,6 +117,14 @@ int main(int argc, char** argv) {
     add_run_settings(batch, batch_args.run);
     add_quality(batch, batch_args.quality);
 
+    GalleryArgs gallery_args;
+    CLI::App* gallery = app.add_subcommand(
+        "gallery", "Draw every border style, flare type and gradient shape on a photo, as labelled contact sheets");
+    gallery->add_option("OUTDIR", gallery_args.output_dir,
+                        "folder for borders.png, flares.png and gradients.png (created if missing)")
+        ->required();
+    gallery->add_option("--photo", gallery_args.photo, "photo to draw on (default: a built-in scene)");
+
     CLI::App* info = app.add_subcommand("info", "Show the library and document-format versions and the processors");
 
     try {
@@ -135,6 +143,7 @@ int main(int argc, char** argv) {
         if (*autofix) return run_auto(auto_args);
         if (*batch) return run_batch(batch_args);
         if (*info) return run_info();
+        if (*gallery) return run_gallery(gallery_args);
     } catch (const UsageError& error) {
         std::fprintf(stderr, "vorlite: %s\n", error.what());
         return kUsageStatus;

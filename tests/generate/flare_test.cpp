@@ -101,6 +101,20 @@ TEST(FlareProcessor, EachExactShapeTheSameOnEveryPlatform) {
     }
 }
 
+TEST(FlareProcessor, EachDesignedShapeIsLockedAndKeepsAlpha) {
+    const std::pair<const char*, uint32_t> shapes[] = {
+        {"angleGaussian", 464130900u}, {"stardom", 2761628532u},     {"lobes", 689894675u},     {"dimondFlare", 2293481914u}, {"crossFlare", 3939885250u},
+        {"cornerFlares", 1761551564u},  {"fingerFlare", 1998663608u}, {"blobFlare", 2939811948u}, {"blah", 593473566u},
+    };
+    for (const auto& [type, sum] : shapes) {
+        TestBitmap b(41, 31);
+        ASSERT_EQ(run(VLPLRunFlareProcessor, flare_document(type), b.get()), 1) << type;
+        EXPECT_TRUE(b.alpha_kept());
+        EXPECT_FALSE(b.unchanged()) << type;
+        EXPECT_EQ(checksum(b), sum) << type;
+    }
+}
+
 TEST(FlareProcessor, StrengthScalesAlphaAndFailuresTouchNothing) {
     // Strength 0 makes alpha 0: nothing is drawn, yet the run succeeds.
     TestBitmap weak(20, 20);

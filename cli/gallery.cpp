@@ -1,0 +1,232 @@
+// vorlite gallery: every border style, flare type and gradient shape drawn
+// on one photo, as labelled contact sheets, so that a designer can see the
+// whole family at a glance and at a size relative to the picture.
+#include <algorithm>
+#include <cmath>
+#include <cstdio>
+#include <functional>
+#include <string>
+#include <system_error>
+#include <vector>
+
+#include "commands.h"
+#include "image.h"
+#include "label_font.h"
+
+namespace vorlite::cli {
+namespace {
+
+constexpr uint32_t k_tile_width = 320;
+constexpr uint32_t k_columns = 4;
+constexpr uint32_t k_margin = 8;
+constexpr int k_font_scale = 2;
+constexpr uint32_t k_label_height = k_glyph_height * k_font_scale + 8;
+
+struct Sample {
+    std::string label;
+    std::function<void(VorBitmap*)> draw;
+};
+
+// A stand-in photo when none is given: sky, sun and hills, so that light
+// and dark effects both show.
+Image synthetic_scene(uint32_t width, uint32_t height) {
+    Image scene(width, height);
+    for (uint32_t y = 0; y < height; ++y) {
+        for (uint32_t x = 0; x < width; ++x) {
+            const double u = static_cast<double>(x) / width;
+            const double v = static_cast<double>(y) / height;
+            const double hill = 0.62 + 0.08 * std::sin(u * 9.0) + 0.05 * std::sin(u * 23.0 + 1.0);
+            const double sun = std::hypot(u - 0.7, (v - 0.3) * height / width);
+            uint8_t* p = scene.pixel(x, y);
+            if (v > hill) {
+                p[0] = static_cast<uint8_t>(40 + 50 * (1.0 - v));
+                p[1] = static_cast<uint8_t>(90 + 60 * (1.0 - v));
+                p[2] = 50;
+            } else if (sun < 0.06) {
+                p[0] = 255;
+                p[1] = 236;
+                p[2] = 180;
+            } else {
+                p[0] = static_cast<uint8_t>(110 + 120 * v);
+                p[1] = static_cast<uint8_t>(150 + 80 * v);
+                p[2] = static_cast<uint8_t>(230 - 20 * v);
+            }
+            p[3] = 255;
+        }
+    }
+    return scene;
+}
+
+// Area-average downscale to the tile width (never up).
+Image tile_of(const Image& photo) {
+    if (photo.width <= k_tile_width) return photo;
+    const double step = static_cast<double>(photo.width) / k_tile_width;
+    const auto height = std::max<uint32_t>(1, static_cast<uint32_t>(photo.height / step));
+    Image tile(k_tile_width, height);
+    for (uint32_t y = 0; y < height; ++y) {
+        const auto y0 = static_cast<uint32_t>(y * step);
+        const auto y1 = std::min(photo.height, std::max(y0 + 1, static_cast<uint32_t>((y + 1) * step)));
+        for (uint32_t x = 0; x < k_tile_width; ++x) {
+            const auto x0 = static_cast<uint32_t>(x * step);
+            const auto x1 = std::min(photo.width, std::max(x0 + 1, static_cast<uint32_t>((x + 1) * step)));
+            uint32_t sum[4] = {0, 0, 0, 0};
+            for (uint32_t sy = y0; sy < y1; ++sy) {
+                for (uint32_t sx = x0; sx < x1; ++sx) {
+                    for (int c = 0; c < 4; ++c) sum[c] += photo.pixel(sx, sy)[c];
+                }
+            }
+            const uint32_t n = (y1 - y0) * (x1 - x0);
+            for (int c = 0; c < 4; ++c) tile.pixel(x, y)[c] = static_cast<uint8_t>(sum[c] / n);
+        }
+    }
+    return tile;
+}
+
+void draw_label(Image& sheet, uint32_t left, uint32_t top, const std::string& text) {
+    uint32_t x = left;
+    for (const char c : text) {
+        for (int row = 0; row < k_glyph_height; ++row) {
+            for (int column = 0; column < k_glyph_width; ++column) {
+                if (!glyph_cell(c, column, row)) continue;
+                for (int dy = 0; dy < k_font_scale; ++dy) {
+                    for (int dx = 0; dx < k_font_scale; ++dx) {
+                        const uint32_t px = x + static_cast<uint32_t>(column * k_font_scale + dx);
+                        const uint32_t py = top + static_cast<uint32_t>(row * k_font_scale + dy);
+                        if (px >= sheet.width || py >= sheet.height) continue;
+                        uint8_t* p = sheet.pixel(px, py);
+                        p[0] = p[1] = p[2] = 30;
+                    }
+                }
+            }
+        }
+        x += (k_glyph_width + 1) * k_font_scale;
+    }
+}
+
+Image contact_sheet(const Image& tile, const std::vector<Sample>& samples) {
+    const uint32_t rows = static_cast<uint32_t>((samples.size() + k_columns - 1) / k_columns);
+    const uint32_t cell_width = tile.width + k_margin;
+    const uint32_t cell_height = tile.height + k_label_height + k_margin;
+    Image sheet(k_columns * cell_width + k_margin, rows * cell_height + k_margin);
+    std::fill(sheet.rgba.begin(), sheet.rgba.end(), uint8_t{245});
+    for (std::size_t i = 0; i < samples.size(); ++i) {
+        Image drawn = tile;
+        VorBitmap bitmap = drawn.bitmap();
+        samples[i].draw(&bitmap);
+        const uint32_t left = k_margin + static_cast<uint32_t>(i % k_columns) * cell_width;
+        const uint32_t top = k_margin + static_cast<uint32_t>(i / k_columns) * cell_height;
+        for (uint32_t y = 0; y < drawn.height; ++y) {
+            for (uint32_t x = 0; x < drawn.width; ++x) {
+                const uint8_t* from = drawn.pixel(x, y);
+                uint8_t* to = sheet.pixel(left + x, top + y);
+                to[0] = from[0];
+                to[1] = from[1];
+                to[2] = from[2];
+                to[3] = 255;
+            }
+        }
+        draw_label(sheet, left, top + drawn.height + 4, samples[i].label);
+    }
+    return sheet;
+}
+
+// A border record with profile buffers of the larger side, as the named
+// effects build them.
+void draw_border(VorBitmap* bitmap, VorBorderStyle style, bool instant) {
+    const std::size_t larger = std::max(bitmap->width, bitmap->height);
+    std::vector<float> left(larger), right(larger), top(larger), bottom(larger);
+    VorBorderParams p;
+    VorBorderInitParams(&p);
+    p.sideTune0 = 1.0;
+    p.leftProfile = left.data();
+    p.rightProfile = right.data();
+    p.topProfile = top.data();
+    p.bottomProfile = bottom.data();
+    p.style = style;
+    p.seed = 7;
+    p.color = VorColor{250, 248, 240, 255};
+    p.width = 1.0;
+    p.inset = 0.3;
+    p.shadowAngle = 45.0;
+    if (style == VOR_BORDER_VIGNETTE) {
+        p.color = VorColor{0, 0, 0, 230};
+        p.vignetteScale = 0.45 * (bitmap->width + bitmap->height) / 2.0;
+    } else if (style == VOR_BORDER_SHADOW || style == VOR_BORDER_GLIMMO) {
+        p.color = VorColor{20, 20, 20, 255};
+    }
+    if (instant) {
+        VorBordersInstant(bitmap, &p);
+    } else {
+        VorBorders(bitmap, &p);
+    }
+}
+
+std::vector<Sample> border_samples() {
+    const char* names[] = {"halftone", "lines", "smooth", "shadow", "fade", "rough", "bulge", "torn",
+                           "torn_2", "rect", "round", "glimmo", "hard_rand", "instant", "vignette", "viewfinder"};
+    std::vector<Sample> samples;
+    for (int32_t style = 1; style <= 16; ++style) {
+        const bool instant = style == VOR_BORDER_INSTANT;
+        samples.push_back({names[style - 1], [style, instant](VorBitmap* b) { draw_border(b, style, instant); }});
+    }
+    return samples;
+}
+
+std::vector<Sample> flare_samples() {
+    const char* names[] = {"sinc", "gaussianThing", "gaussianThing2", "gaussianThing3", "gaussianThing4",
+                           "angleGaussian", "stardom", "lobes", "type 8", "stripe", "stripe2", "dimondFlare",
+                           "crossFlare", "cornerFlares", "fingerFlare", "blobFlare", "blah", "blob", "blob2"};
+    std::vector<Sample> samples;
+    for (int32_t type = 0; type <= 18; ++type) {
+        samples.push_back({names[type], [type](VorBitmap* b) {
+                               const VorColor warm{255, 222, 170, 235};
+                               VorFlare(b, 1.0f, &warm, type, 0.2f, -0.2f, 0.5f, 0.5f, VOR_BLEND_SCREEN);
+                           }});
+    }
+    return samples;
+}
+
+void draw_gradient(VorBitmap* bitmap, int32_t shape) {
+    VorGradient g;
+    if (!VorGradientBuild(&g, 3, 2)) return;
+    g.colorStops[0] = {{255, 170, 60, 255}, 0.0};
+    g.colorStops[1] = {{230, 60, 120, 255}, 50.0};
+    g.colorStops[2] = {{40, 40, 160, 255}, 100.0};
+    g.opacityStops[0] = {0.85, 0.0};
+    g.opacityStops[1] = {0.85, 100.0};
+    VorGradientShapeParams p;
+    VorGradientShapeParamsInit(&p);
+    p.shape = shape;
+    p.angle = shape == VOR_GRADIENT_RADIAL ? 0.0 : -0.6;
+    p.xCenter = shape == VOR_GRADIENT_RADIAL ? 0.7 : 0.0;
+    p.yCenter = shape == VOR_GRADIENT_RADIAL ? 0.3 : 0.0;
+    p.vignetteScale = 0.7;
+    VorGradientApply(bitmap, &p, &g, VOR_BLEND_OVERLAY, 1.0);
+    VorGradientFree(&g);
+}
+
+std::vector<Sample> gradient_samples() {
+    return {{"linear", [](VorBitmap* b) { draw_gradient(b, VOR_GRADIENT_LINEAR); }},
+            {"radial", [](VorBitmap* b) { draw_gradient(b, VOR_GRADIENT_RADIAL); }},
+            {"linearVignette", [](VorBitmap* b) { draw_gradient(b, VOR_GRADIENT_LINEAR_VIGNETTE); }}};
+}
+
+}  // namespace
+
+int run_gallery(const GalleryArgs& args) {
+    const Image photo = args.photo ? read_image(*args.photo) : synthetic_scene(960, 640);
+    std::error_code error;
+    std::filesystem::create_directories(args.output_dir, error);
+    if (error) throw Failure(args.output_dir.string() + ": cannot create the folder (" + error.message() + ")");
+    const Image tile = tile_of(photo);
+    const std::pair<const char*, std::vector<Sample>> families[] = {
+        {"borders.png", border_samples()}, {"flares.png", flare_samples()}, {"gradients.png", gradient_samples()}};
+    for (const auto& [name, samples] : families) {
+        const std::filesystem::path out = args.output_dir / name;
+        write_image(contact_sheet(tile, samples), out, kDefaultQuality);
+        std::printf("%s\n", out.string().c_str());
+    }
+    return 0;
+}
+
+}  // namespace vorlite::cli
