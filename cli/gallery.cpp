@@ -148,6 +148,36 @@ void draw_border(VorBitmap* bitmap, VorBorderStyle style, bool instant) {
     p.width = 1.0;
     p.inset = 0.3;
     p.shadowAngle = 45.0;
+    // The side styles take their width as a share of width + height, as
+    // the named effects set them.
+    switch (style) {
+        case VOR_BORDER_BULGE:
+            p.width = 0.05;
+            p.inset = 0.5;
+            p.sideTune3 = 0.0;
+            break;
+        case VOR_BORDER_TORN:
+            p.width = 0.02;
+            p.sideTune1 = 0.015;
+            p.sideTune2 = 0.5;
+            break;
+        case VOR_BORDER_TORN_2:
+            p.width = 0.04;
+            p.sideTune1 = 0.018;
+            p.sideTune2 = 0.4;
+            break;
+        case VOR_BORDER_RECT:
+            p.width = 0.021;
+            break;
+        case VOR_BORDER_ROUND:
+            p.width = 0.025;
+            break;
+        case VOR_BORDER_GLIMMO:
+            p.width = 0.03;
+            break;
+        default:
+            break;
+    }
     if (style == VOR_BORDER_VIGNETTE) {
         p.color = VorColor{0, 0, 0, 230};
         p.vignetteScale = 0.45 * (bitmap->width + bitmap->height) / 2.0;

@@ -5,9 +5,6 @@
 
 extern "C" {
 
-VOR_API void VorBordersSide(VorBitmap*, const VorBorderParams*) {}
-VOR_API void VorBordersDoubleSided(VorBitmap*, const VorBorderParams*) {}
-VOR_API void VorBordersInstant(VorBitmap*, const VorBorderParams*) {}
 VOR_API void VorFlareLegacyCorvale(VorBitmap*, const VLPLRunOptions*) {}
 VOR_API void VorFlareLegacyEmberly(VorBitmap*, const VLPLRunOptions*) {}
 

@@ -71,7 +71,7 @@ TEST(Flare, TypeKeywords) {
                            "crossFlare", "cornerFlares", "fingerFlare", "blobFlare", "blah", "blob", "blob2"};
     for (int32_t i = 0; i < 19; ++i) {
         if (i == VOR_FLARE_NONE) continue;
-        const Json j("\"" + std::string(names[i]) + "\"");
+        const Json j(std::string("\"") + names[i] + "\"");
         VorFlareType t = -1;
         EXPECT_EQ(VLPLFlareTypeFromFlareTypeVal(j.value, &t), 1) << names[i];
         EXPECT_EQ(t, i);

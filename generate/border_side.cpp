@@ -1,0 +1,265 @@
+// Edge frames drawn from fractal edge profiles: the side styles (bulge,
+// torn, rect, round, glimmo), each a band along the four edges whose inner
+// boundary a profile roughens, and the double-sided torn strip (torn_2),
+// torn along both of its edges, made to be layered at low opacity.
+//
+// The band is B = width x (width + height) pixels deep; sideTune1 x
+// (width + height) is the profiles' amplitude, sideTune2 their roughness,
+// sideTune3 the softness of the inner edge as a share of B, and the other
+// tunings shape each style as noted where they are read.
+#include <algorithm>
+#include <cmath>
+#include <cstdint>
+
+#include "core/core_internal.h"
+#include "generate/generate_internal.h"
+
+namespace {
+
+constexpr float k_pi = 3.14159265f;
+
+// A tuning field made safe: NaN and infinities give the fallback, and the
+// value is held within [low, high] so that no document can make a band
+// wider than the picture or a loop longer than its rows.
+float tuning(double value, float low, float high, float fallback) {
+    if (!(value == value) || value > 1e30 || value < -1e30) return fallback;
+    const auto v = static_cast<float>(value);
+    return v < low ? low : (v > high ? high : v);
+}
+
+// Two profiles along the longer side, each drawn by midpoint displacement
+// from a seed that the style's generator gives just before the call.
+struct Profiles {
+    const float* first;
+    const float* second;
+    std::uint32_t length;
+};
+
+void fill_profile(float* profile, std::uint32_t length, float roughness, std::int32_t mode, VorRNG* rng) {
+    profile[0] = 0.0f;
+    profile[length - 1] = 0.0f;
+    const std::uint32_t seed = VorRNGNextInt(rng);
+    VorMPDSeed(profile, 0, static_cast<std::int32_t>(length - 1), 1.0f, roughness, mode, seed);
+}
+
+// Where a pixel lies relative to the four edges: its distance from each
+// and its position along each (so that opposite edges read their profile
+// in opposite directions and no two edges share a stretch of it).
+struct EdgePlace {
+    float depth;     // distance from the edge, pixels
+    std::uint32_t along;
+};
+
+// The band's shape: how deep it reaches at a place along an edge, and how
+// soft its inner boundary is there.
+class Band {
+public:
+    Band(const VorBorderParams& p, const Profiles& profiles, std::uint32_t width, std::uint32_t height)
+        : style_(p.style), profiles_(profiles), width_(width), height_(height) {
+        const auto sum = static_cast<float>(static_cast<std::uint64_t>(width) + height);
+        const float shorter = static_cast<float>(std::min(width, height));
+        depth_ = std::min(tuning(p.width, 0.0f, 1.0f, 0.0f) * sum, 0.45f * shorter);
+        amplitude_ = std::min(tuning(p.sideTune1, 0.0f, 1.0f, 0.0f) * sum, 0.25f * shorter);
+        softness_ = std::max(1.0f, tuning(p.sideTune3, 0.0f, 4.0f, 1.0f) * depth_ * 0.5f);
+        swell_ = tuning(p.inset, 0.0f, 1.0f, 0.0f);
+        fringe_ = tuning(p.sideTune4, 0.0f, 4.0f, 0.28f);
+        fringe_power_ = tuning(p.sideTune5, 0.1f, 8.0f, 1.5f);
+        streaks_ = tuning(p.sideTune0, 0.0f, 2.0f, 1.0f);
+        if (style_ == VOR_BORDER_RECT || style_ == VOR_BORDER_ROUND) {
+            // A print mat is cut almost straight: a trace of the profile.
+            amplitude_ = std::max(amplitude_, 0.0015f * sum * tuning(p.sideTune6, 0.0f, 4.0f, 1.0f));
+        }
+        if (style_ == VOR_BORDER_ROUND) corner_ = tuning(p.sideTune5, 0.0f, 4.0f, 1.5f) * depth_;
+        if (style_ == VOR_BORDER_GLIMMO) amplitude_ = std::max(amplitude_, 0.35f * depth_);
+    }
+
+    // The deepest the band can reach, so rows and columns beyond it are skipped.
+    float reach() const { return depth_ + amplitude_ + 2.0f * softness_ + fringe_ * depth_ + 2.0f; }
+
+    // Coverage 0..1 of the colour at a pixel.
+    float coverage(std::uint32_t x, std::uint32_t y) const {
+        const std::uint32_t last = profiles_.length - 1;
+        const EdgePlace edges[4] = {
+            {static_cast<float>(y), x},                           // top
+            {static_cast<float>(height_ - 1 - y), last - x},      // bottom
+            {static_cast<float>(x), y},                           // left
+            {static_cast<float>(width_ - 1 - x), last - y},       // right
+        };
+        float inside = -1e30f;  // how far into the band, pixels
+        float soft = softness_;
+        for (int e = 0; e < 4; ++e) {
+            const bool horizontal = e < 2;
+            const std::uint32_t along = edges[e].along;
+            const float t = static_cast<float>(horizontal ? x : y) / static_cast<float>(horizontal ? width_ : height_);
+            const float n1 = (horizontal ? profiles_.first : profiles_.second)[along];
+            const float n2 = (horizontal ? profiles_.second : profiles_.first)[along];
+            const float reach_here = depth_at(t, n1);
+            const float into = reach_here - edges[e].depth;
+            if (into > inside) {
+                inside = into;
+                if (style_ == VOR_BORDER_GLIMMO) {
+                    // Streaks: the softness itself wanders along the edge.
+                    soft = softness_ * (0.4f + streaks_ * std::fabs(n2) * 1.5f) + 1.0f;
+                }
+            }
+        }
+        if (corner_ > 0.0f) inside = std::max(inside, rounded_corner(x, y));
+        return shape(inside, soft);
+    }
+
+private:
+    float depth_at(float t, float noise) const {
+        switch (style_) {
+            case VOR_BORDER_BULGE: {
+                // Shallower at the corners, swelling to the full depth at
+                // the middle of each side.
+                const float swell = 1.0f - swell_ + swell_ * vorlite::core::sinf(k_pi * t);
+                return depth_ * swell + amplitude_ * noise;
+            }
+            case VOR_BORDER_GLIMMO:
+                return depth_ * 0.75f + amplitude_ * noise;
+            default:
+                return depth_ + amplitude_ * noise;
+        }
+    }
+
+    // Inside a corner square the inner boundary is a quarter circle of
+    // radius R, so the opening of the frame has rounded corners.
+    float rounded_corner(std::uint32_t x, std::uint32_t y) const {
+        const float c = depth_ + corner_;
+        const float fx = static_cast<float>(x < width_ / 2 ? x : width_ - 1 - x);
+        const float fy = static_cast<float>(y < height_ / 2 ? y : height_ - 1 - y);
+        if (fx >= c || fy >= c) return -1e30f;
+        const float dx = c - fx;
+        const float dy = c - fy;
+        return std::sqrt(dx * dx + dy * dy) - corner_;
+    }
+
+    // From the distance into the band to a coverage: a one-pixel ramp for
+    // crisp edges, a cosine ramp over the softness for soft ones, a fringe
+    // of paper fibres beyond a tear.
+    float shape(float inside, float soft) const {
+        switch (style_) {
+            case VOR_BORDER_TORN: {
+                if (inside >= 0.5f) return 1.0f;
+                const float fringe = fringe_ * 0.25f * depth_ + 1.0f;
+                const float u = (0.5f - inside) / fringe;
+                if (u >= 1.0f) return 0.0f;
+                return 0.6f * vorlite::core::powf(1.0f - u, fringe_power_) + (inside > -0.5f ? 0.4f * (inside + 0.5f) : 0.0f);
+            }
+            case VOR_BORDER_BULGE:
+            case VOR_BORDER_GLIMMO: {
+                const float u = std::clamp(inside / soft + 0.5f, 0.0f, 1.0f);
+                const float eased = 0.5f - 0.5f * vorlite::core::cosf(k_pi * u);
+                // The wet-plate edge darkens more steeply than it fades.
+                return style_ == VOR_BORDER_GLIMMO ? std::sqrt(eased) : eased;
+            }
+            default:
+                return std::clamp(inside + 0.5f, 0.0f, 1.0f);
+        }
+    }
+
+    std::int32_t style_;
+    Profiles profiles_;
+    std::uint32_t width_;
+    std::uint32_t height_;
+    float depth_ = 0.0f;
+    float amplitude_ = 0.0f;
+    float softness_ = 1.0f;
+    float swell_ = 0.0f;
+    float fringe_ = 0.0f;
+    float fringe_power_ = 1.5f;
+    float streaks_ = 1.0f;
+    float corner_ = 0.0f;
+};
+
+void lay(std::uint8_t* p, const VorColor& colour, std::uint32_t mode, float opacity) {
+    VorColor out = vorlite::core::load_pixel(p);
+    VorColorBlend(&out, &colour, mode, opacity);
+    vorlite::core::store_pixel(p, out);
+}
+
+// Visits the pixels within `reach` of an edge, row by row; `cover` gives
+// each one's coverage.
+template <typename Cover>
+void paint_edges(VorBitmap* bitmap, const VorColor& colour, std::uint32_t mode, float reach, Cover cover) {
+    const std::uint32_t width = bitmap->width;
+    const std::uint32_t height = bitmap->height;
+    const float opacity = static_cast<float>(colour.a) * vorlite::core::k_inv255;
+    const auto margin = static_cast<std::uint32_t>(std::min(reach, static_cast<float>(std::max(width, height))));
+    for (std::uint32_t y = 0; y < height; ++y) {
+        const bool near_row = y < margin || height - 1 - y < margin;
+        std::uint8_t* row = bitmap->data + static_cast<std::size_t>(y) * width * 4;
+        for (std::uint32_t x = 0; x < width; ++x) {
+            if (!near_row && x >= margin && width - 1 - x >= margin) {
+                x = width - margin - 1;
+                continue;
+            }
+            const float c = cover(x, y);
+            if (c > 0.0f) lay(row + std::size_t{x} * 4, colour, mode, opacity * c);
+        }
+    }
+}
+
+}  // namespace
+
+extern "C" {
+
+VOR_API void VorBordersSide(VorBitmap* bitmap, const VorBorderParams* params) {
+    const std::uint32_t width = bitmap->width;
+    const std::uint32_t height = bitmap->height;
+    // The callers lend one profile of the longer side; the band's second
+    // profile is working memory of its own.
+    if (width < 2 || height < 2 || params->bottomProfile == nullptr) return;
+    const std::uint32_t length = std::max(width, height);
+    vorlite::core::WorkingArray<float> second;
+    if (!second.build(length)) return;
+    VorRNG rng;
+    VorRNGSeed(&rng, params->seed);
+    const float roughness = tuning(params->sideTune2, -4.0f, 16.0f, 0.5f);
+    fill_profile(params->bottomProfile, length, roughness, params->mpdMode, &rng);
+    fill_profile(second.get(), length, roughness, params->mpdMode, &rng);
+    const Profiles profiles{params->bottomProfile, second.get(), length};
+    const Band band(*params, profiles, width, height);
+    paint_edges(bitmap, params->color, static_cast<std::uint32_t>(params->blendMode), band.reach(),
+                [&](std::uint32_t x, std::uint32_t y) { return band.coverage(x, y); });
+}
+
+VOR_API void VorBordersDoubleSided(VorBitmap* bitmap, const VorBorderParams* params) {
+    const std::uint32_t width = bitmap->width;
+    const std::uint32_t height = bitmap->height;
+    if (width < 2 || height < 2 || params->leftProfile == nullptr || params->rightProfile == nullptr) return;
+    const std::uint32_t length = std::max(width, height);
+    VorRNG rng;
+    VorRNGSeed(&rng, params->seed);
+    const float roughness = tuning(params->sideTune2, -4.0f, 16.0f, 0.4f);
+    fill_profile(params->leftProfile, length, roughness, params->mpdMode, &rng);
+    fill_profile(params->rightProfile, length, roughness, params->mpdMode, &rng);
+    const float* inner = params->leftProfile;
+    const float* outer = params->rightProfile;
+    const auto sum = static_cast<float>(static_cast<std::uint64_t>(width) + height);
+    const float shorter = static_cast<float>(std::min(width, height));
+    const float depth = std::min(tuning(params->width, 0.0f, 1.0f, 0.0f) * sum, 0.45f * shorter);
+    const float amplitude = std::min(tuning(params->sideTune1, 0.0f, 1.0f, 0.0f) * sum, 0.25f * shorter);
+    const std::uint32_t last = length - 1;
+    // A strip torn on both sides: its outer edge wanders just inside the
+    // picture's edge, its inner edge about the band's depth; between the
+    // two it covers fully, with a pixel of ramp at each tear.
+    const auto cover = [&](std::uint32_t x, std::uint32_t y) {
+        const float d[4] = {static_cast<float>(y), static_cast<float>(height - 1 - y), static_cast<float>(x),
+                            static_cast<float>(width - 1 - x)};
+        const std::uint32_t along[4] = {x, last - x, y, last - y};
+        float best = 0.0f;
+        for (int e = 0; e < 4; ++e) {
+            const float from = 0.5f * amplitude * std::fabs(outer[along[e]]);
+            const float to = depth + amplitude * inner[along[e]];
+            const float c = std::min(std::clamp(d[e] - from + 0.5f, 0.0f, 1.0f), std::clamp(to - d[e] + 0.5f, 0.0f, 1.0f));
+            best = std::max(best, c);
+        }
+        return best;
+    };
+    paint_edges(bitmap, params->color, static_cast<std::uint32_t>(params->blendMode), depth + amplitude * 2.0f + 2.0f,
+                cover);
+}
+
+}  // extern "C"
