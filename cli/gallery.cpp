@@ -213,6 +213,21 @@ std::vector<Sample> flare_samples() {
                                VorFlare(b, 1.0f, &warm, type, 0.2f, -0.2f, 0.5f, 0.5f, VOR_BLEND_SCREEN);
                            }});
     }
+    samples.push_back({"ring", [](VorBitmap* b) {
+                           const VorColor cool{190, 220, 255, 200};
+                           const float size = static_cast<float>(b->width + b->height);
+                           VorRingFlare(b, 0.4f * b->width, 0.45f * b->height, 0.08f * size, &cool, VOR_BLEND_SCREEN);
+                       }});
+    samples.push_back({"corvale", [](VorBitmap* b) {
+                           VLPLRunOptions o;
+                           VorEffectInitParams(&o);
+                           VorFlareLegacyCorvale(b, &o);
+                       }});
+    samples.push_back({"emberly", [](VorBitmap* b) {
+                           VLPLRunOptions o;
+                           VorEffectInitParams(&o);
+                           VorFlareLegacyEmberly(b, &o);
+                       }});
     return samples;
 }
 

@@ -909,6 +909,11 @@ VOR_API void VorFlare(VorBitmap* bitmap, float fScale, const VorColor* color, Vo
                       float dx, float dy, float dsx, float dsy, uint32_t blendMode);
 /* A flare keyword to its type; 0 for a null, non-string or unknown node. */
 VOR_API int VLPLFlareTypeFromFlareTypeVal(const yajl_val value, VorFlareType* outType);
+/* A ring of light of the given radius around (cx, cy), in pixels, with a
+ * soft glow filling it: a lens ghost or a display's lamp. Only the ring's
+ * bounding box is visited; alpha kept. */
+VOR_API void VorRingFlare(VorBitmap* bitmap, float cx, float cy, float radius, const VorColor* color,
+                          uint32_t blendMode);
 /* The preset flares of the legacy catalogue; the seed and strength of the
  * options place and weigh them. Alpha kept. */
 VOR_API void VorFlareLegacyCorvale(VorBitmap* bitmap, const VLPLRunOptions* options);

@@ -1,5 +1,6 @@
 #include <gtest/gtest.h>
 
+#include <limits>
 #include <string>
 
 #include "tests/test_support.h"
@@ -150,6 +151,50 @@ TEST(FlareProcessor, SurvivesDegenerateNumbers) {
             EXPECT_EQ(run(VLPLRunFlareProcessor, parameters, b.get()), 1) << parameters;
             EXPECT_TRUE(b.alpha_kept());
         }
+    }
+}
+
+}  // namespace
+
+namespace {
+
+TEST(RingFlare, LightsOnlyItsBoxAndNothingWithoutRadius) {
+    TestBitmap b(60, 40, VorColor{20, 20, 20, 42});
+    const VorColor cool{190, 220, 255, 220};
+    VorRingFlare(b.get(), 30.0f, 20.0f, 8.0f, &cool, VOR_BLEND_SCREEN);
+    for (uint32_t y = 0; y < 40; ++y) {
+        for (uint32_t x = 0; x < 60; ++x) {
+            const bool outside = x < 18 || x > 42 || y < 8 || y > 32;
+            if (outside) {
+                ASSERT_TRUE(pixel_unchanged(b, x, y)) << x << "," << y;
+            }
+        }
+    }
+    // Brightest on the ring, dimmer at the centre, alpha kept.
+    EXPECT_GT(b.at(38, 20, 2), b.at(30, 20, 2));
+    EXPECT_GT(b.at(30, 20, 2), 20);
+    EXPECT_TRUE(b.alpha_kept());
+    for (const float radius : {0.0f, -3.0f, std::numeric_limits<float>::quiet_NaN()}) {
+        TestBitmap t(20, 20);
+        VorRingFlare(t.get(), 10.0f, 10.0f, radius, &cool, VOR_BLEND_SCREEN);
+        EXPECT_TRUE(t.unchanged());
+    }
+}
+
+TEST(PresetFlares, SeededWeighedByStrengthAndLocked) {
+    using Preset = void (*)(VorBitmap*, const VLPLRunOptions*);
+    const std::pair<Preset, uint32_t> presets[] = {{VorFlareLegacyCorvale, 3757588115u}, {VorFlareLegacyEmberly, 3558511737u}};
+    for (const auto& [preset, sum] : presets) {
+        TestBitmap one(64, 48), two(64, 48), none(64, 48);
+        const VLPLRunOptions o = vorlite::test::run_options(0.8, 12);
+        preset(one.get(), &o);
+        preset(two.get(), &o);
+        EXPECT_EQ(one.bytes, two.bytes);
+        EXPECT_TRUE(one.alpha_kept());
+        EXPECT_EQ(checksum(one), sum);
+        const VLPLRunOptions off = vorlite::test::run_options(0.0, 12);
+        preset(none.get(), &off);
+        EXPECT_TRUE(none.unchanged());
     }
 }
 
