@@ -367,3 +367,27 @@ TEST_F(Vorlite, HelpAndInfoSucceed) {
     EXPECT_NE(info.out.find("effect document format 1.0.1"), std::string::npos) << info.out;
     EXPECT_NE(info.out.find(" colorMatrixTransform "), std::string::npos) << info.out;
 }
+
+// ---- gallery -----------------------------------------------------------
+
+TEST_F(Vorlite, GalleryDrawsEveryFamilyAsALabelledSheet) {
+    vorlite::cli::write_image(sample(64, 48, true), file("photo.png"), 90);
+    const Outcome outcome = run("gallery " + file("sheets").string() + " --photo " + file("photo.png").string());
+    ASSERT_EQ(outcome.status, 0) << outcome.err;
+    // Tiles of 64 x 48 in rows of four, 8 pixels apart, a 22-pixel label
+    // under each: 16 border styles, 22 flares (19 types, ring, two
+    // presets), 3 gradient shapes.
+    const std::pair<const char*, uint32_t> sheets[] = {{"borders.png", 4}, {"flares.png", 6}, {"gradients.png", 1}};
+    for (const auto& [name, rows] : sheets) {
+        const Image sheet = vorlite::cli::read_image(file("sheets") / name);
+        EXPECT_EQ(sheet.width, 4 * (64 + 8) + 8u) << name;
+        EXPECT_EQ(sheet.height, rows * (48 + 22 + 8) + 8u) << name;
+    }
+    // The first border tile (halftone) differs from the plain photo.
+    const Image borders = vorlite::cli::read_image(file("sheets") / "borders.png");
+    const Image photo = vorlite::cli::read_image(file("photo.png"));
+    EXPECT_FALSE(std::equal(photo.pixel(0, 0), photo.pixel(64, 0), borders.pixel(8, 8)));
+
+    EXPECT_EQ(run("gallery " + file("sheets").string() + " --photo " + file("missing.png").string()).status, 1);
+    EXPECT_EQ(run("gallery").status, 2);
+}
