@@ -105,6 +105,7 @@ int main(int argc, char** argv) {
     if (benchmark::ReportUnrecognizedArguments(argc, argv)) return 2;
     add_pairs();
     add_solo();
+    add_generated();
     const std::string document = add_document(options.documents);
     if (document.empty() && !options.documents.empty()) {
         std::fprintf(stderr, "vorlite_bench: no candidate document has five processors that run\n");

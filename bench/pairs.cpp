@@ -10,18 +10,9 @@ namespace vorlite::bench {
 
 namespace {
 
-const char* label_of(const char* operation, const char* side) {
-    for (const Comparison& row : kComparisons) {
-        if (std::strcmp(row.operation, operation) != 0) continue;
-        if (std::strcmp(side, kOurs) == 0) return row.ours_label;
-        if (std::strcmp(side, row.peer) == 0) return row.peer_label;
-    }
-    return operation;
-}
-
 void add_pair(const char* operation, const char* side, const BitmapSize& size,
               std::function<void(benchmark::State&)> body) {
-    add_benchmark(operation, side, size, label_of(operation, side), std::move(body));
+    add_benchmark(operation, side, size, comparison_label(operation, side), std::move(body));
 }
 
 void add_lut(const BitmapSize& size) {
@@ -42,14 +33,7 @@ void add_lut(const BitmapSize& size) {
         cv::Mat dst(src.size(), src.type());
         time_as_is(state, [&] { return lut_vips(src, lut, dst); });
     });
-    add_pair("lut", "memcpy", size, [size](benchmark::State& state) {
-        const cv::Mat& src = sample(size);
-        cv::Mat dst(src.size(), src.type());
-        time_as_is(state, [&] {
-            std::memcpy(dst.data, src.data, src.total() * src.elemSize());
-            return true;
-        });
-    });
+    add_memcpy_floor("lut", size);
 }
 
 void add_matrix(const BitmapSize& size) {
@@ -156,6 +140,26 @@ void add_sharpen_amounts() {
 }
 
 }  // namespace
+
+const char* comparison_label(const char* operation, const char* side) {
+    for (const Comparison& row : kComparisons) {
+        if (std::strcmp(row.operation, operation) != 0) continue;
+        if (std::strcmp(side, kOurs) == 0) return row.ours_label;
+        if (std::strcmp(side, row.peer) == 0) return row.peer_label;
+    }
+    return operation;
+}
+
+void add_memcpy_floor(const char* operation, const BitmapSize& size) {
+    add_pair(operation, "memcpy", size, [size](benchmark::State& state) {
+        const cv::Mat& src = sample(size);
+        cv::Mat dst(src.size(), src.type());
+        time_as_is(state, [&] {
+            std::memcpy(dst.data, src.data, src.total() * src.elemSize());
+            return true;
+        });
+    });
+}
 
 void add_pairs() {
     for (const BitmapSize& size : kSizes) {

@@ -5,6 +5,8 @@
 #include <string>
 #include <vector>
 
+#include "catalogue.h"
+
 namespace vorlite::bench {
 
 // The library against its peers, at both sizes, and the sharpening amounts.
@@ -12,6 +14,17 @@ void add_pairs();
 
 // The library's operations that have no peer, at both sizes.
 void add_solo();
+
+// The generated effects: vignette and gradient against memcpy, every
+// banded frame, gradient shape and flare type on its own, at both sizes.
+void add_generated();
+
+// The label of one side of a comparison in the catalogue.
+const char* comparison_label(const char* operation, const char* side);
+
+// memcpy of the bitmap's bytes under the operation's name: the floor a
+// whole-image pass is held against.
+void add_memcpy_floor(const char* operation, const BitmapSize& size);
 
 // Picks the first of the candidate effect documents that has exactly five
 // processors and runs on a small bitmap, and registers each processor and

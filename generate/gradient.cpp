@@ -144,22 +144,41 @@ private:
 
 // The pixel's place along the gradient: its offset from the origin in
 // units of the gradient's length, projected on the angle or measured as a
-// distance.
-struct Coordinates {
-    double inv;
-    double sa;
-    double ca;
-    double inv_width;
-    double inv_height;
-    bool radial;
+// distance. The column's part (u x cos, or u^2) is formed once a column
+// and the row's once a row; each pixel then adds them in the same order.
+class Coordinates {
+public:
+    bool build(const VorGradientShapeParams& params, std::uint32_t width, std::uint32_t height) {
+        radial_ = params.shape == VOR_GRADIENT_RADIAL;
+        inv_ = 1.0 / params.scale;
+        sa_ = vorlite::core::sin(params.angle);
+        inv_height_ = 1.0 / static_cast<double>(height);
+        y_center_ = params.yCenter;
+        if (!columns_.build(width)) return false;
+        const double inv_width = 1.0 / static_cast<double>(width);
+        const double ca = vorlite::core::cos(params.angle);
+        for (std::uint32_t x = 0; x < width; ++x) {
+            const double u = (static_cast<double>(x) * inv_width - params.xCenter) * inv_;
+            columns_[x] = radial_ ? u * u : u * ca;
+        }
+        return true;
+    }
+    // The row's part: v x sin, or v^2.
+    double row(std::uint32_t y) const {
+        const double v = (static_cast<double>(y) * inv_height_ - y_center_) * inv_;
+        return radial_ ? v * v : v * sa_;
+    }
+    double at(std::uint32_t x, double row) const {
+        return radial_ ? std::sqrt(row + columns_[x]) : columns_[x] - row;
+    }
 
-    double row(std::uint32_t y, double y_center) const {
-        return (static_cast<double>(y) * inv_height - y_center) * inv;
-    }
-    double at(std::uint32_t x, double v, double x_center) const {
-        const double u = (static_cast<double>(x) * inv_width - x_center) * inv;
-        return radial ? std::sqrt(v * v + u * u) : u * ca - v * sa;
-    }
+private:
+    bool radial_ = false;
+    double inv_ = 0.0;
+    double sa_ = 0.0;
+    double inv_height_ = 0.0;
+    double y_center_ = 0.0;
+    WorkingArray<double> columns_;
 };
 
 float entry_opacity(double opacity, const VorColor& entry) {
@@ -172,15 +191,15 @@ void blend_pixel(std::uint8_t* p, const VorColor& entry, std::uint32_t mode, flo
     vorlite::core::store_pixel(p, out);
 }
 
-void draw_plain(VorBitmap* bitmap, const VorGradientShapeParams& params, const Coordinates& c,
+void draw_plain(VorBitmap* bitmap, const VorGradientShapeParams&, const Coordinates& c,
                 const VorColor* table, std::uint32_t mode, double opacity) {
     EntryRows rows;
     const bool by_rows = mode != VOR_BLEND_COLOR && rows.build();
     std::uint8_t* p = bitmap->data;
     for (std::uint32_t y = 0; y < bitmap->height; ++y) {
-        const double v = c.row(y, params.yCenter);
+        const double v = c.row(y);
         for (std::uint32_t x = 0; x < bitmap->width; ++x, p += 4) {
-            const std::uint32_t index = table_index(c.at(x, v, params.xCenter));
+            const std::uint32_t index = table_index(c.at(x, v));
             const VorColor& entry = table[index];
             if (by_rows) {
                 const std::uint8_t* r = rows.rows(index, entry, mode, entry_opacity(opacity, entry));
@@ -202,9 +221,9 @@ void draw_vignetted(VorBitmap* bitmap, const VorGradientShapeParams& params, con
                                                         params.shapeMode, params.dx, params.dy);
     std::uint8_t* p = bitmap->data;
     for (std::uint32_t y = 0; y < bitmap->height; ++y) {
-        const double v = c.row(y, params.yCenter);
+        const double v = c.row(y);
         for (std::uint32_t x = 0; x < bitmap->width; ++x, p += 4) {
-            const VorColor& entry = table[table_index(c.at(x, v, params.xCenter))];
+            const VorColor& entry = table[table_index(c.at(x, v))];
             const double weighted = opacity * static_cast<double>(entry.a * vorlite::core::k_inv255) *
                                     static_cast<double>(vignette.weight(x, y));
             blend_pixel(p, entry, mode, static_cast<float>(weighted));
@@ -214,12 +233,8 @@ void draw_vignetted(VorBitmap* bitmap, const VorGradientShapeParams& params, con
 
 void draw(VorBitmap* bitmap, const VorGradientShapeParams& params, const VorColor* table,
           std::uint32_t mode, double opacity) {
-    const Coordinates c{1.0 / params.scale,
-                        vorlite::core::sin(params.angle),
-                        vorlite::core::cos(params.angle),
-                        1.0 / static_cast<double>(bitmap->width),
-                        1.0 / static_cast<double>(bitmap->height),
-                        params.shape == VOR_GRADIENT_RADIAL};
+    Coordinates c;
+    if (!c.build(params, bitmap->width, bitmap->height)) return;
     if (params.shape == VOR_GRADIENT_LINEAR_VIGNETTE) {
         draw_vignetted(bitmap, params, c, table, mode, opacity);
     } else {

@@ -12,18 +12,38 @@ using vorlite::generate::k_vignette_start;
 
 // Squared distance from the centre on the vignette's scale: in pixels, or
 // with x and y normalised by the bitmap's width and height (an ellipse of
-// the picture's proportions).
+// the picture's proportions). The row's share is formed once a row.
 struct Distance {
     bool stretch;
     float k;
     float iw;
     float ih;
 
-    float operator()(std::int64_t ex, std::int64_t ey) const {
-        if (stretch) return (static_cast<float>(ex * ex) * iw + static_cast<float>(ey * ey) * ih) * k;
-        return static_cast<float>(ex * ex + ey * ey) * k;
+    struct Row {
+        std::int64_t ey2;
+        float share;
+    };
+    Row row(std::int64_t ey) const {
+        const std::int64_t ey2 = ey * ey;
+        return {ey2, static_cast<float>(ey2) * ih};
+    }
+    float operator()(std::int64_t ex, const Row& r) const {
+        const std::int64_t ex2 = ex * ex;
+        if (stretch) return (static_cast<float>(ex2) * iw + r.share) * k;
+        return static_cast<float>(ex2 + r.ey2) * k;
     }
 };
+
+// The memo's three channel maps at a level, filled on first use: a
+// memoized blend is exactly these three lookups.
+const std::uint8_t (*level_maps(VorColorBlendMemoTable* memo, const VorColor& colour,
+                                std::uint32_t level))[256] {
+    if (memo->computed[level] == 0) {
+        VorColor scratch{0, 0, 0, 0};
+        VorColorBlendMemoized(&scratch, &colour, level, memo);
+    }
+    return memo->maps[level];
+}
 
 // The ramp's opacity level for the memoized blend.
 std::uint32_t ramp_level(float t, std::uint8_t alpha) {
@@ -57,24 +77,26 @@ VOR_API void VorVignette(VorBitmap* bitmap, const VorBorderParams* params) {
     // colour mode blends channel by channel, so the memo gives the direct
     // blend's bytes beyond the radius too.
     const bool memo_at_full = mode != VOR_BLEND_COLOR;
+    const auto* full = level_maps(memo.get(), colour, colour.a);
     std::uint8_t* p = bitmap->data;
     for (std::uint32_t y = 0; y < height; ++y) {
-        const std::int64_t ey = static_cast<std::int64_t>(y) - cy;
+        const Distance::Row row = distance.row(static_cast<std::int64_t>(y) - cy);
         for (std::uint32_t x = 0; x < width; ++x, p += 4) {
-            const float t = vorlite::generate::shape_vignette(distance(static_cast<std::int64_t>(x) - cx, ey),
+            const float t = vorlite::generate::shape_vignette(distance(static_cast<std::int64_t>(x) - cx, row),
                                                               params->shapeMode);
             if (!(t >= k_vignette_start)) continue;
-            VorColor out = vorlite::core::load_pixel(p);
-            if (t > k_vignette_full) {
-                if (memo_at_full) {
-                    VorColorBlendMemoized(&out, &colour, colour.a, memo.get());
-                } else {
-                    VorColorBlend(&out, &colour, mode, full_opacity);
-                }
-            } else {
-                VorColorBlendMemoized(&out, &colour, ramp_level(t, colour.a), memo.get());
+            const std::uint8_t(*maps)[256] = full;
+            if (!(t > k_vignette_full)) {
+                maps = level_maps(memo.get(), colour, ramp_level(t, colour.a));
+            } else if (!memo_at_full) {
+                VorColor out = vorlite::core::load_pixel(p);
+                VorColorBlend(&out, &colour, mode, full_opacity);
+                vorlite::core::store_pixel(p, out);
+                continue;
             }
-            vorlite::core::store_pixel(p, out);
+            p[0] = maps[0][p[0]];
+            p[1] = maps[1][p[1]];
+            p[2] = maps[2][p[2]];
         }
     }
 }
