@@ -93,22 +93,43 @@ float clamp_unit(float v) {
     return v;
 }
 
-// floor(x + 0.5) in double, as a byte.
+// floor(x + 0.5) in double, as a byte. From 1 up the floor is the
+// truncation; below 1 (and NaN) it is 0 or less.
 std::uint8_t rounded(double v) {
-    const double r = std::floor(v + 0.5);
-    if (!(r > 0.0)) return 0;
+    const double r = v + 0.5;
+    if (!(r >= 1.0)) return 0;
     if (r >= 255.0) return 255;
     return static_cast<std::uint8_t>(r);
 }
 
 // (1 - v) of the colour and v of the pixel; alpha kept.
-void mix(std::uint8_t* p, const VorColor& colour, float v) {
+void mix(std::uint8_t* p, VorColor colour, float v) {
     const double keep = v;
     const double cover = 1.0 - keep;
-    p[0] = rounded(cover * colour.r + keep * p[0]);
-    p[1] = rounded(cover * colour.g + keep * p[1]);
-    p[2] = rounded(cover * colour.b + keep * p[2]);
+    const double r = cover * colour.r + keep * p[0];
+    const double g = cover * colour.g + keep * p[1];
+    const double b = cover * colour.b + keep * p[2];
+    p[0] = rounded(r);
+    p[1] = rounded(g);
+    p[2] = rounded(b);
 }
+
+// The halftone's two cosine factors, one per column, in the precision of
+// the band (double) and of the area outside the frame (float).
+struct HalftoneColumns {
+    vorlite::core::WorkingArray<double> inside;
+    vorlite::core::WorkingArray<float> outside;
+
+    bool build(std::uint32_t width, double f) {
+        if (!inside.build(width) || !outside.build(width)) return false;
+        for (std::uint32_t x = 0; x < width; ++x) {
+            const double fx = (static_cast<double>(x) - static_cast<double>(width / 2)) * f;
+            inside[x] = vorlite::core::cos(fx);
+            outside[x] = vorlite::core::cosf(static_cast<float>(fx));
+        }
+        return true;
+    }
+};
 
 class ThetaRenderer {
 public:
@@ -120,32 +141,75 @@ public:
           radius_f_(band.width * static_cast<float>(band.corner) * k_sqrt2_f),
           shadow_radius_(static_cast<double>(band.width) * k_sqrt2) {
         VorRNGSeed(&rng_, p.seed);
+        find_deep_columns();
     }
+
+    // False when the halftone's column table cannot be had.
+    bool prepare() { return p_.style != VOR_BORDER_HALFTONE || halftone_.build(bitmap_->width, band_.halftone); }
 
     void draw() {
         const std::uint32_t width = bitmap_->width;
         const std::uint32_t height = bitmap_->height;
-        std::uint8_t* p = bitmap_->data;
-        for (std::uint32_t y = 0; y < height; ++y) {
+        std::uint8_t* row_pixels = bitmap_->data;
+        for (std::uint32_t y = 0; y < height; ++y, row_pixels += static_cast<std::size_t>(width) * 4) {
             const bool upper = y < height / 2;
             const double from_edge_y = upper ? static_cast<double>(y) : static_cast<double>(height - 1 - y);
             const std::int64_t dr = truncated(from_edge_y - (upper ? p_.insetTop : p_.insetBottom));
-            for (std::uint32_t x = 0; x < width; ++x, p += 4) {
-                const bool left = x < width / 2;
-                const double from_edge_x = left ? static_cast<double>(x) : static_cast<double>(width - 1 - x);
-                const std::int64_t dc = truncated(from_edge_x - (left ? p_.insetLeft : p_.insetRight));
-                pixel(p, x, y, dr, dc, upper, left);
-            }
+            start_row(y);
+            // Away from the top and bottom bands and the corners, only the
+            // columns of the side bands can change.
+            const bool deep_row = dr >= 0 && static_cast<double>(dr) >= radius_ && deep(dr);
+            const std::uint32_t skip_begin = deep_row ? deep_begin_ : width;
+            const std::uint32_t skip_end = deep_row ? deep_end_ : width;
+            for (std::uint32_t x = 0; x < skip_begin; ++x) pixel(row_pixels + std::size_t{x} * 4, x, y, dr, upper);
+            for (std::uint32_t x = skip_end; x < width; ++x) pixel(row_pixels + std::size_t{x} * 4, x, y, dr, upper);
         }
     }
 
 private:
-    void pixel(std::uint8_t* p, std::uint32_t x, std::uint32_t y, std::int64_t dr, std::int64_t dc, bool upper,
-               bool left) {
+    std::int64_t column_distance(std::uint32_t x) const {
+        const std::uint32_t width = bitmap_->width;
+        const bool left = x < width / 2;
+        const double from_edge_x = left ? static_cast<double>(x) : static_cast<double>(width - 1 - x);
+        return truncated(from_edge_x - (left ? p_.insetLeft : p_.insetRight));
+    }
+
+    // Inside the frame and at least a band's width from its edge.
+    bool deep(std::int64_t distance) const { return distance >= 0 && !(static_cast<float>(distance) < band_.width); }
+
+    // The columns a deep row leaves alone. The column distance rises over
+    // the left half and falls over the right one, so they form one run.
+    void find_deep_columns() {
+        const std::uint32_t width = bitmap_->width;
+        deep_begin_ = width;
+        deep_end_ = width;
+        for (std::uint32_t x = 0; x < width; ++x) {
+            if (!deep(column_distance(x))) continue;
+            if (deep_begin_ == width) deep_begin_ = x;
+            deep_end_ = x + 1;
+        }
+    }
+
+    // The terms of the line and halftone patterns that depend on the row alone.
+    void start_row(std::uint32_t y) {
+        const double from_middle = static_cast<double>(y) - static_cast<double>(bitmap_->height / 2);
+        if (p_.style == VOR_BORDER_LINES) {
+            const double phi = (from_middle / static_cast<double>(bitmap_->height)) * k_line_phase;
+            line_level_ = (vorlite::core::cos(phi / p_.lineSpacing) + 1.0) * 0.8;
+        } else if (p_.style == VOR_BORDER_HALFTONE) {
+            const double fy = from_middle * band_.halftone;
+            halftone_row_ = vorlite::core::cos(fy);
+            halftone_row_f_ = vorlite::core::cosf(static_cast<float>(fy));
+        }
+    }
+
+    void pixel(std::uint8_t* p, std::uint32_t x, std::uint32_t y, std::int64_t dr, bool upper) {
+        const bool left = x < bitmap_->width / 2;
+        const std::int64_t dc = column_distance(x);
         const float b = band_.width;
         const float d = frame_distance(dr, dc, radius_, radius_f_);
         if (dr < 0 || dc < 0) {
-            outside(p, x, y, dr, dc, upper, left);
+            outside(p, x, y, upper, left);
             return;
         }
         if (!(d < b)) return;
@@ -153,17 +217,13 @@ private:
         const float w4 = (w * w) * (w * w);
         switch (p_.style) {
             case VOR_BORDER_HALFTONE: {
-                const double h = halftone(x, y);
+                const double h = halftone_row_ * halftone_.inside[x] + 1.0;
                 const double v = d > 0.0f ? 1.0 - static_cast<double>(w4) * 2.0 * h : 1.0 - 2.0 * h;
                 mix(p, p_.color, clamp_unit(static_cast<float>(v)));
                 return;
             }
             case VOR_BORDER_LINES: {
-                const double phi = ((static_cast<double>(y) - static_cast<double>(bitmap_->height / 2)) /
-                                    static_cast<double>(bitmap_->height)) *
-                                   k_line_phase;
-                const double v =
-                    1.0 - 2.0 * ((vorlite::core::cos(phi / p_.lineSpacing) + 1.0) * 0.8) * static_cast<double>(w4);
+                const double v = 1.0 - 2.0 * line_level_ * static_cast<double>(w4);
                 mix(p, p_.color, clamp_unit(static_cast<float>(v)));
                 return;
             }
@@ -188,30 +248,15 @@ private:
         }
     }
 
-    void outside(std::uint8_t* p, std::uint32_t x, std::uint32_t y, std::int64_t, std::int64_t, bool upper,
-                 bool left) {
+    void outside(std::uint8_t* p, std::uint32_t x, std::uint32_t y, bool upper, bool left) {
         if (p_.style == VOR_BORDER_HALFTONE) {
-            const float h = halftone_f(x, y);
+            const float h = halftone_row_f_ * halftone_.outside[x] + 1.0f;
             mix(p, p_.color, clamp_unit(1.0f - 2.0f * h));
         } else if (p_.style == VOR_BORDER_SHADOW) {
             shadow(p, y, x, upper, left, false);
         } else {
             vorlite::core::store_pixel(p, p_.color);
         }
-    }
-
-    // The halftone's dot pattern: 0 between dots, 2 at their centres.
-    double halftone(std::uint32_t x, std::uint32_t y) const {
-        const double f = band_.halftone;
-        const double fy = (static_cast<double>(y) - static_cast<double>(bitmap_->height / 2)) * f;
-        const double fx = (static_cast<double>(x) - static_cast<double>(bitmap_->width / 2)) * f;
-        return vorlite::core::cos(fy) * vorlite::core::cos(fx) + 1.0;
-    }
-    float halftone_f(std::uint32_t x, std::uint32_t y) const {
-        const double f = band_.halftone;
-        const auto fy = static_cast<float>((static_cast<double>(y) - static_cast<double>(bitmap_->height / 2)) * f);
-        const auto fx = static_cast<float>((static_cast<double>(x) - static_cast<double>(bitmap_->width / 2)) * f);
-        return vorlite::core::cosf(fy) * vorlite::core::cosf(fx) + 1.0f;
     }
 
     // A soft drop shadow cast by the frame onto the picture: distances from
@@ -254,6 +299,12 @@ private:
     float radius_f_;
     double shadow_radius_;
     VorRNG rng_;
+    std::uint32_t deep_begin_ = 0;
+    std::uint32_t deep_end_ = 0;
+    HalftoneColumns halftone_;
+    double halftone_row_ = 0.0;
+    float halftone_row_f_ = 0.0f;
+    double line_level_ = 0.0;
 };
 
 }  // namespace
@@ -273,7 +324,10 @@ VOR_API void VorBordersTheta(VorBitmap* bitmap, VorBorderParams* params) {
         params->insetBottom = inset;
     }
     if (bitmap->height < 1 || bitmap->width < 1) return;
-    ThetaRenderer(bitmap, *params, band).draw();
+    ThetaRenderer renderer(bitmap, *params, band);
+    // Without memory for the halftone's column table nothing is drawn, as
+    // with any working buffer that cannot be had.
+    if (renderer.prepare()) renderer.draw();
 }
 
 }  // extern "C"

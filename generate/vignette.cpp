@@ -10,34 +10,10 @@ namespace {
 using vorlite::generate::k_vignette_full;
 using vorlite::generate::k_vignette_start;
 
-// Squared distance from the centre on the vignette's scale: in pixels, or
-// with x and y normalised by the bitmap's width and height (an ellipse of
-// the picture's proportions). The row's share is formed once a row.
-struct Distance {
-    bool stretch;
-    float k;
-    float iw;
-    float ih;
-
-    struct Row {
-        std::int64_t ey2;
-        float share;
-    };
-    Row row(std::int64_t ey) const {
-        const std::int64_t ey2 = ey * ey;
-        return {ey2, static_cast<float>(ey2) * ih};
-    }
-    float operator()(std::int64_t ex, const Row& r) const {
-        const std::int64_t ex2 = ex * ex;
-        if (stretch) return (static_cast<float>(ex2) * iw + r.share) * k;
-        return static_cast<float>(ex2 + r.ey2) * k;
-    }
-};
-
 // The memo's three channel maps at a level, filled on first use: a
 // memoized blend is exactly these three lookups.
-const std::uint8_t (*level_maps(VorColorBlendMemoTable* memo, const VorColor& colour,
-                                std::uint32_t level))[256] {
+using LevelMaps = const std::uint8_t (*)[256];
+LevelMaps level_maps(VorColorBlendMemoTable* memo, const VorColor& colour, std::uint32_t level) {
     if (memo->computed[level] == 0) {
         VorColor scratch{0, 0, 0, 0};
         VorColorBlendMemoized(&scratch, &colour, level, memo);
@@ -51,6 +27,93 @@ std::uint32_t ramp_level(float t, std::uint8_t alpha) {
         vorlite::generate::vignette_ramp(t) * static_cast<float>(alpha));
     return static_cast<std::uint32_t>(vorlite::core::clamp_byte(level));
 }
+
+// Sharper modes bend t before the ramp reads it; a compile-time copy per
+// mode keeps the choice out of the pixel loop.
+template <std::int32_t Mode>
+float shaped(float t) {
+    return vorlite::generate::shape_vignette(t, Mode);
+}
+
+struct Vignette {
+    VorBitmap* bitmap;
+    VorColorBlendMemoTable* memo;
+    VorColor colour;
+    std::uint32_t mode;
+    float k;
+    float iw;
+    float ih;
+    std::int64_t cx;
+    std::int64_t cy;
+
+    // Squared distance from the centre on the vignette's scale: in pixels,
+    // or with x and y normalised by the width and height (an ellipse of the
+    // picture's proportions); the row's share is formed once a row.
+    template <bool Stretch, std::int32_t Mode>
+    void draw() const {
+        const std::uint32_t width = bitmap->width;
+        const std::uint32_t height = bitmap->height;
+        const float full_opacity = static_cast<float>(colour.a) * vorlite::core::k_inv255;
+        // The memo's level colour.a is that very opacity, and every mode but
+        // the colour mode blends channel by channel, so the memo gives the
+        // direct blend's bytes beyond the radius too.
+        const bool memo_at_full = mode != VOR_BLEND_COLOR;
+        const LevelMaps full = level_maps(memo, colour, colour.a);
+        // Neighbouring pixels mostly share a level: the last one's maps are
+        // kept at hand.
+        std::uint32_t last_level = colour.a;
+        LevelMaps last_maps = full;
+        std::uint8_t* p = bitmap->data;
+        for (std::uint32_t y = 0; y < height; ++y) {
+            const std::int64_t ey = static_cast<std::int64_t>(y) - cy;
+            const std::int64_t ey2 = ey * ey;
+            const float row_share = static_cast<float>(ey2) * ih;
+            for (std::uint32_t x = 0; x < width; ++x, p += 4) {
+                const std::int64_t ex = static_cast<std::int64_t>(x) - cx;
+                const std::int64_t ex2 = ex * ex;
+                const float distance =
+                    Stretch ? (static_cast<float>(ex2) * iw + row_share) * k : static_cast<float>(ex2 + ey2) * k;
+                const float t = shaped<Mode>(distance);
+                if (!(t >= k_vignette_start)) continue;
+                LevelMaps maps = full;
+                if (!(t > k_vignette_full)) {
+                    const std::uint32_t level = ramp_level(t, colour.a);
+                    if (level != last_level) {
+                        last_level = level;
+                        last_maps = level_maps(memo, colour, level);
+                    }
+                    maps = last_maps;
+                } else if (!memo_at_full) {
+                    VorColor out = vorlite::core::load_pixel(p);
+                    VorColorBlend(&out, &colour, mode, full_opacity);
+                    vorlite::core::store_pixel(p, out);
+                    continue;
+                }
+                p[0] = maps[0][p[0]];
+                p[1] = maps[1][p[1]];
+                p[2] = maps[2][p[2]];
+            }
+        }
+    }
+
+    template <bool Stretch>
+    void draw_shaped(std::int32_t shape_mode) const {
+        switch (shape_mode) {
+            case VOR_SHAPE_SHARP:
+                draw<Stretch, VOR_SHAPE_SHARP>();
+                return;
+            case VOR_SHAPE_MEDIUM_SHARP:
+                draw<Stretch, VOR_SHAPE_MEDIUM_SHARP>();
+                return;
+            case VOR_SHAPE_ULTRA_SHARP:
+                draw<Stretch, VOR_SHAPE_ULTRA_SHARP>();
+                return;
+            default:
+                draw<Stretch, VOR_SHAPE_NORMAL>();
+                return;
+        }
+    }
+};
 
 }  // namespace
 
@@ -66,38 +129,19 @@ VOR_API void VorVignette(VorBitmap* bitmap, const VorBorderParams* params) {
     VorColorBlendInitMemozied(memo.get(), mode);
     const float w = static_cast<float>(width);
     const float h = static_cast<float>(height);
-    const Distance distance{params->stretch != 0, vorlite::generate::vignette_scale(params->vignetteScale),
-                            1.0f / (w * w), 1.0f / (h * h)};
-    const std::int64_t cx = static_cast<std::int64_t>(width / 2) + vorlite::generate::vignette_offset(width, params->dx);
-    const std::int64_t cy =
-        static_cast<std::int64_t>(height / 2) + vorlite::generate::vignette_offset(height, params->dy);
-    const VorColor colour = params->color;
-    const float full_opacity = static_cast<float>(colour.a) * vorlite::core::k_inv255;
-    // The memo's level colour.a is that very opacity, and every mode but the
-    // colour mode blends channel by channel, so the memo gives the direct
-    // blend's bytes beyond the radius too.
-    const bool memo_at_full = mode != VOR_BLEND_COLOR;
-    const auto* full = level_maps(memo.get(), colour, colour.a);
-    std::uint8_t* p = bitmap->data;
-    for (std::uint32_t y = 0; y < height; ++y) {
-        const Distance::Row row = distance.row(static_cast<std::int64_t>(y) - cy);
-        for (std::uint32_t x = 0; x < width; ++x, p += 4) {
-            const float t = vorlite::generate::shape_vignette(distance(static_cast<std::int64_t>(x) - cx, row),
-                                                              params->shapeMode);
-            if (!(t >= k_vignette_start)) continue;
-            const std::uint8_t(*maps)[256] = full;
-            if (!(t > k_vignette_full)) {
-                maps = level_maps(memo.get(), colour, ramp_level(t, colour.a));
-            } else if (!memo_at_full) {
-                VorColor out = vorlite::core::load_pixel(p);
-                VorColorBlend(&out, &colour, mode, full_opacity);
-                vorlite::core::store_pixel(p, out);
-                continue;
-            }
-            p[0] = maps[0][p[0]];
-            p[1] = maps[1][p[1]];
-            p[2] = maps[2][p[2]];
-        }
+    const Vignette vignette{bitmap,
+                            memo.get(),
+                            params->color,
+                            mode,
+                            vorlite::generate::vignette_scale(params->vignetteScale),
+                            1.0f / (w * w),
+                            1.0f / (h * h),
+                            static_cast<std::int64_t>(width / 2) + vorlite::generate::vignette_offset(width, params->dx),
+                            static_cast<std::int64_t>(height / 2) + vorlite::generate::vignette_offset(height, params->dy)};
+    if (params->stretch != 0) {
+        vignette.draw_shaped<true>(params->shapeMode);
+    } else {
+        vignette.draw_shaped<false>(params->shapeMode);
     }
 }
 
