@@ -85,6 +85,18 @@ inline VLPLRunOptions run_options(double strength = 1.0, uint32_t seed = 0) {
     return o;
 }
 
+// A histogram map of saturated colours that change from level to level,
+// so that every blend mode, the colour mode included, moves the pixels.
+inline VorHistMap sample_map() {
+    VorHistMap m;
+    for (int i = 0; i < 256; ++i) {
+        m.map[0][i] = static_cast<uint8_t>(255 - i);
+        m.map[1][i] = static_cast<uint8_t>(i / 2);
+        m.map[2][i] = static_cast<uint8_t>(i * 7 + 3);
+    }
+    return m;
+}
+
 using Adapter = int (*)(const yajl_val, VorBitmap*, const VLPLRunOptions*);
 
 // Runs a processor adapter on a JSON parameters text; -1 when the text does not parse.

@@ -10,15 +10,6 @@ namespace {
 
 using namespace vorlite::test;
 
-VorHistMap sample_map() {
-    VorHistMap m;
-    for (int i = 0; i < 256; ++i) {
-        m.map[0][i] = static_cast<uint8_t>(255 - i);
-        m.map[1][i] = static_cast<uint8_t>(i / 2);
-        m.map[2][i] = static_cast<uint8_t>(i * 7 + 3);
-    }
-    return m;
-}
 
 std::string json_array(const uint8_t* levels, int count = 256) {
     std::string s = "[";

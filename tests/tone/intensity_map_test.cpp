@@ -9,19 +9,9 @@
 
 namespace {
 
+using vorlite::test::sample_map;
 using vorlite::test::TestBitmap;
 
-// Saturated colours that change from level to level, so every mode, the
-// colour mode included, moves the pixels.
-VorHistMap sample_map() {
-    VorHistMap m;
-    for (int i = 0; i < 256; ++i) {
-        m.map[0][i] = static_cast<uint8_t>(255 - i);
-        m.map[1][i] = static_cast<uint8_t>(i / 2);
-        m.map[2][i] = static_cast<uint8_t>(i * 7 + 3);
-    }
-    return m;
-}
 
 TEST(IntensityMap, PicksTheMapColourAtTheRoundedLuminance) {
     const VorHistMap m = sample_map();
