@@ -1,5 +1,9 @@
 #include <gtest/gtest.h>
 
+#include <array>
+#include <bit>
+#include <cmath>
+#include <cstring>
 #include <string>
 #include <vector>
 
@@ -10,35 +14,17 @@ namespace {
 
 using vorlite::test::checksum;
 using vorlite::test::Json;
+using vorlite::test::kAlpha;
+using vorlite::test::rgba;
 using vorlite::test::run;
 using vorlite::test::TestBitmap;
-
-// A record with profiles for every edge, as the legacy effects build them.
-struct Border {
-    VorBorderParams p;
-    std::vector<float> left, right, top, bottom;
-    Border(const VorBitmap& b, int32_t style) {
-        VorBorderInitParams(&p);
-        const std::size_t n = b.width > b.height ? b.width : b.height;
-        left.resize(n);
-        right.resize(n);
-        top.resize(n);
-        bottom.resize(n);
-        p.leftProfile = left.data();
-        p.rightProfile = right.data();
-        p.topProfile = top.data();
-        p.bottomProfile = bottom.data();
-        p.style = style;
-        p.color = VorColor{30, 60, 90, 200};
-        p.seed = 5;
-    }
-};
 
 TEST(BorderDecoders, StyleAndShapeKeywords) {
     const char* styles[] = {"halftone", "lines", "smooth", "shadow", "fade", "rough", "bulge", "torn",
                             "torn_2", "rect", "round", "glimmo", "hard_rand", "instant", "vignette", "viewfinder"};
     for (int32_t i = 0; i < 16; ++i) {
-        const Json j("\"" + std::string(styles[i]) + "\"");
+        const std::string text = std::string(1, '"') + styles[i] + '"';
+        const Json j(text);
         VorBorderStyle s = -1;
         EXPECT_EQ(VLPLBorderStyleFromBorderStyleTypeVal(j.value, &s), 1);
         EXPECT_EQ(s, i + 1);
@@ -91,40 +77,73 @@ TEST(BorderDecoders, ShapeScalesTheRadiusByTheBitmapAndTheStrength) {
     EXPECT_EQ(p.vignetteScale, 1.0);
 }
 
+TEST(Borders, DefaultsLeaveTheSideTuneAndTheProfilesAlone) {
+    VorBorderParams p;
+    std::memset(&p, 0xAB, sizeof p);
+    VorBorderParams untouched = p;
+    VorBorderInitParams(&p);
+    EXPECT_EQ(std::memcmp(&p.sideTune0, &untouched.sideTune0, sizeof p.sideTune0), 0);
+    EXPECT_EQ(p.leftProfile, untouched.leftProfile);
+    EXPECT_EQ(p.topProfile, untouched.topProfile);
+    EXPECT_EQ(p.cornerFactor, 2.222);
+    EXPECT_EQ(p.sideTune4, 0.28);
+    EXPECT_EQ(rgba(p.color), (std::array<int, 4>{255, 255, 255, 255}));
+    EXPECT_EQ(p.style, VOR_BORDER_NONE);
+}
+
 TEST(Borders, StylesWithoutARendererLeaveThePicture) {
     for (const int32_t style : {int32_t{VOR_BORDER_NONE}, int32_t{VOR_BORDER_INSTANT}, int32_t{17}, int32_t{-3}}) {
         TestBitmap b(20, 10);
-        Border border(b.bitmap, style);
-        VorBorders(b.get(), &border.p);
+        VorBorderParams p;
+        VorBorderInitParams(&p);
+        p.style = style;
+        VorBorders(b.get(), &p);
         EXPECT_TRUE(b.unchanged()) << style;
     }
 }
 
-// White picture, opaque black vignette in the normal mode, so each byte
-// reads as 255 minus the opacity the pixel got.
-TestBitmap vignetted(uint32_t w, uint32_t h, double radius, uint8_t stretch = 0) {
-    TestBitmap b(w, h, VorColor{255, 255, 255, 255});
+// White picture, opaque black vignette (normal mode unless said), so each
+// byte reads as 255 minus the opacity the pixel got.
+TestBitmap vignetted(uint32_t w, uint32_t h, double radius, uint8_t stretch = 0, int32_t mode = VOR_BLEND_NORMAL) {
+    TestBitmap b(w, h, VorColor{255, 255, 255, kAlpha});
     VorBorderParams p;
     VorBorderInitParams(&p);
     p.style = VOR_BORDER_VIGNETTE;
     p.color = VorColor{0, 0, 0, 255};
+    p.blendMode = mode;
     p.vignetteScale = radius;
     p.stretch = stretch;
     VorBorders(b.get(), &p);
+    EXPECT_TRUE(b.alpha_kept());
     return b;
 }
 
-TEST(Vignette, ClearCentreSmoothRampAndAJumpToFullAtTheRadius) {
-    const TestBitmap b = vignetted(81, 1, 30.0);
-    // t = d^2 / (30^2 x 0.8695652): below 0.04 (d <= 5) nothing changes;
-    // the ramp reaches about 0.99 at d = 30 and jumps to 1 just beyond.
-    EXPECT_EQ(b.pixel(40).r, 255);
-    EXPECT_EQ(b.pixel(45).r, 255);
-    EXPECT_LT(b.pixel(46).r, 255);
-    for (std::size_t x = 41; x < 70; ++x) EXPECT_LE(b.pixel(x + 1).r, b.pixel(x).r) << x;
-    EXPECT_GT(b.pixel(70).r, 0);
-    EXPECT_EQ(b.pixel(71).r, 0);
-    EXPECT_EQ(b.pixel(80).r, 0);
+TEST(Vignette, RampStartsAtExactlyPointZeroFourAndJumpsToFullAbove1Point15) {
+    struct Case {
+        const char* name;
+        float radius;
+        uint32_t mode;
+        int neighbour;  // the four pixels at distance 1
+        int diagonal;   // the four at distance sqrt 2
+    };
+    const float q25 = std::bit_cast<float>(0x40AB94B5u);  // r^2 x 0.8695652 is exactly 25
+    const Case cases[] = {
+        // Radius 1 makes k = 1.15 itself: the neighbours sit on the ramp's
+        // end (level 253 of black over white leaves 2), the diagonals are
+        // beyond it and get the full colour.
+        {"at 1.15", 1.0f, VOR_BLEND_NORMAL, 2, 0},
+        // k = 0.04 exactly: the neighbours take the ramp at level 0, which
+        // only a mode without a rule shows (it blackens whatever it blends);
+        // one float more radius puts them below the ramp.
+        {"at 0.04", q25, 7, 0, 0},
+        {"below 0.04", std::nextafter(q25, 10.0f), 7, 255, 0},
+    };
+    for (const Case& c : cases) {
+        const TestBitmap b = vignetted(3, 3, c.radius, 0, static_cast<int32_t>(c.mode));
+        EXPECT_EQ(b.pixel(4).r, 255) << c.name;
+        for (const std::size_t i : {1, 3, 5, 7}) EXPECT_EQ(b.pixel(i).r, c.neighbour) << c.name << " " << i;
+        for (const std::size_t i : {0, 2, 6, 8}) EXPECT_EQ(b.pixel(i).r, c.diagonal) << c.name << " " << i;
+    }
 }
 
 TEST(Vignette, ZeroRadiusCoversEverythingButTheCentre) {
@@ -163,72 +182,6 @@ TEST(VignetteProcessor, DrawsOrRefusesWithoutTouching) {
         EXPECT_EQ(run(VLPLRunVignetteProcessor, parameters, t.get()), 0) << parameters;
         EXPECT_TRUE(t.unchanged()) << parameters;
     }
-}
-
-TEST(BandedFrames, WriteTheirInsetBackAndPaintAllFourBytesOutside) {
-    TestBitmap b(100, 80);
-    Border border(b.bitmap, VOR_BORDER_HALFTONE);
-    border.p.inset = 2.0;
-    VorBorders(b.get(), &border.p);
-    // B = 180 x 0.033333335 = 6.0000005; the inset is trunc(2 B) = 12.
-    EXPECT_EQ(border.p.insetLeft, 12.0);
-    EXPECT_EQ(border.p.insetBottom, 12.0);
-
-    TestBitmap s(100, 80);
-    Border smooth(s.bitmap, VOR_BORDER_SMOOTH);
-    smooth.p.inset = 3.0;
-    VorBorders(s.get(), &smooth.p);
-    for (int c = 0; c < 4; ++c) EXPECT_EQ(s.at(1, 40, c), (&smooth.p.color.r)[c]);
-    EXPECT_EQ(s.at(50, 40, 3), s.before[(40 * 100 + 50) * 4 + 3]);
-    EXPECT_NE(s.at(5, 40, 0), s.before[(40 * 100 + 5) * 4]);
-    EXPECT_EQ(s.at(50, 40, 0), s.before[(40 * 100 + 50) * 4]);
-
-    // The viewfinder keeps the caller's insets.
-    TestBitmap v(100, 80);
-    Border viewfinder(v.bitmap, VOR_BORDER_VIEWFINDER);
-    viewfinder.p.insetTop = 9.0;
-    VorBorders(v.get(), &viewfinder.p);
-    EXPECT_EQ(viewfinder.p.insetTop, 9.0);
-    EXPECT_EQ(viewfinder.p.insetLeft, 0.0);
-    EXPECT_EQ(v.at(50, 8, 0), viewfinder.p.color.r);
-}
-
-TEST(BandedFrames, EachStyleTheSameOnEveryPlatformAndSeeded) {
-    const std::pair<int32_t, uint32_t> styles[] = {
-        {VOR_BORDER_HALFTONE, 498186788u}, {VOR_BORDER_LINES, 507199619u}, {VOR_BORDER_SMOOTH, 3834591790u}, {VOR_BORDER_SHADOW, 2074940347u},
-        {VOR_BORDER_FADE, 3589777004u},     {VOR_BORDER_ROUGH, 589468756u}, {VOR_BORDER_VIEWFINDER, 3243210250u}, {VOR_BORDER_HARD_RAND, 3046902400u},
-    };
-    for (const auto& [style, sum] : styles) {
-        TestBitmap b(61, 47);
-        Border border(b.bitmap, style);
-        border.p.inset = 0.5;
-        border.p.shadowAngle = 30.0;
-        VorBorders(b.get(), &border.p);
-        EXPECT_EQ(checksum(b), sum) << style;
-        EXPECT_TRUE(b.alpha_kept()) << style;
-        if (style == VOR_BORDER_ROUGH || style == VOR_BORDER_VIEWFINDER || style == VOR_BORDER_HARD_RAND) {
-            TestBitmap other(61, 47);
-            Border reseeded(other.bitmap, style);
-            reseeded.p.inset = 0.5;
-            reseeded.p.seed = 6;
-            VorBorders(other.get(), &reseeded.p);
-            EXPECT_NE(checksum(other), sum) << style;
-        }
-    }
-}
-
-TEST(RoughFrame, BlendsOutsideItsTornEdgesAndKeepsAlpha) {
-    TestBitmap b(64, 48);
-    Border border(b.bitmap, VOR_BORDER_HARD_RAND);
-    border.p.opacity = 1.0;
-    border.p.cornerOffset = 3.0;
-    VorBorders(b.get(), &border.p);
-    EXPECT_TRUE(b.alpha_kept());
-    EXPECT_EQ(border.left[47], 3.0f);
-    EXPECT_EQ(border.bottom[0], 3.0f);
-    EXPECT_EQ(border.top[63], 0.0f);
-    EXPECT_EQ(b.at(0, 0, 1), 60);
-    EXPECT_EQ(b.at(32, 24, 1), b.before[(24 * 64 + 32) * 4 + 1]);
 }
 
 }  // namespace
