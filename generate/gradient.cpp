@@ -116,7 +116,13 @@ std::uint32_t table_index(double coordinate) {
     float g = static_cast<float>(coordinate);
     if (!(g > 0.0f)) g = 0.0f;
     if (g > 1.0f) g = 1.0f;
-    return static_cast<std::uint32_t>(std::floor(static_cast<double>(g * 1023.0f) + 0.5));
+    // floor(g x 1023 + 0.5); the sum is at least 0.5, so truncation is the
+    // floor, without a call into the maths library per pixel.
+    return static_cast<std::uint32_t>(static_cast<double>(g * 1023.0f) + 0.5);
+}
+
+float entry_opacity(double opacity, const VorColor& entry) {
+    return static_cast<float>(opacity * static_cast<double>(entry.a * vorlite::core::k_inv255));
 }
 
 // Every mode but the colour mode blends each channel on its own, and a
@@ -125,19 +131,28 @@ std::uint32_t table_index(double coordinate) {
 // needs them, and a pixel costs three lookups instead of a blend.
 class EntryRows {
 public:
+    EntryRows(const VorColor* table, std::uint32_t mode, double opacity)
+        : table_(table), mode_(mode), opacity_(opacity) {}
     bool build() { return rows_.build(k_table_size * 3, 256) && filled_.build(k_table_size); }
-    const std::uint8_t* rows(std::uint32_t index, const VorColor& entry, std::uint32_t mode, float opacity) {
+    const std::uint8_t* rows(std::uint32_t index) {
         std::uint8_t* r = &rows_[std::size_t{index} * 768];
-        if (!filled_[index]) {
-            filled_[index] = 1;
-            vorlite::color::blend_channel_row(mode, entry.r, opacity, r);
-            vorlite::color::blend_channel_row(mode, entry.g, opacity, r + 256);
-            vorlite::color::blend_channel_row(mode, entry.b, opacity, r + 512);
-        }
+        if (!filled_[index]) fill(index, r);
         return r;
     }
 
 private:
+    void fill(std::uint32_t index, std::uint8_t* r) {
+        filled_[index] = 1;
+        const VorColor& entry = table_[index];
+        const float opacity = entry_opacity(opacity_, entry);
+        vorlite::color::blend_channel_row(mode_, entry.r, opacity, r);
+        vorlite::color::blend_channel_row(mode_, entry.g, opacity, r + 256);
+        vorlite::color::blend_channel_row(mode_, entry.b, opacity, r + 512);
+    }
+
+    const VorColor* table_;
+    std::uint32_t mode_;
+    double opacity_;
     WorkingArray<std::uint8_t> rows_;
     WorkingArray<std::uint8_t> filled_;
 };
@@ -181,9 +196,6 @@ private:
     WorkingArray<double> columns_;
 };
 
-float entry_opacity(double opacity, const VorColor& entry) {
-    return static_cast<float>(opacity * static_cast<double>(entry.a * vorlite::core::k_inv255));
-}
 
 void blend_pixel(std::uint8_t* p, const VorColor& entry, std::uint32_t mode, float opacity) {
     VorColor out = vorlite::core::load_pixel(p);
@@ -193,7 +205,7 @@ void blend_pixel(std::uint8_t* p, const VorColor& entry, std::uint32_t mode, flo
 
 void draw_plain(VorBitmap* bitmap, const VorGradientShapeParams&, const Coordinates& c,
                 const VorColor* table, std::uint32_t mode, double opacity) {
-    EntryRows rows;
+    EntryRows rows(table, mode, opacity);
     const bool by_rows = mode != VOR_BLEND_COLOR && rows.build();
     std::uint8_t* p = bitmap->data;
     for (std::uint32_t y = 0; y < bitmap->height; ++y) {
@@ -202,7 +214,7 @@ void draw_plain(VorBitmap* bitmap, const VorGradientShapeParams&, const Coordina
             const std::uint32_t index = table_index(c.at(x, v));
             const VorColor& entry = table[index];
             if (by_rows) {
-                const std::uint8_t* r = rows.rows(index, entry, mode, entry_opacity(opacity, entry));
+                const std::uint8_t* r = rows.rows(index);
                 p[0] = r[p[0]];
                 p[1] = r[256 + p[1]];
                 p[2] = r[512 + p[2]];
