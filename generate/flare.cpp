@@ -12,121 +12,134 @@
 
 namespace {
 
-using vorlite::generate::FlareRow;
+using vorlite::generate::FlareLight;
+using vorlite::generate::FlareRaster;
+using vorlite::generate::flare_from_exponent;
+using vorlite::generate::paint_flare;
 
-// The shape's own coordinates: the flare's centre at the origin, the
-// flare's size along each axis one unit (type 0 is isotropic instead, its
-// unit set by the overall scale alone).
-class FlareFrame {
-public:
-    FlareFrame(std::uint32_t width, std::uint32_t height, float scale, const VorColor& colour, VorFlareType type,
-               float dx, float dy, float dsx, float dsy)
-        : type_(type),
-          hw_(static_cast<std::int64_t>(std::floor(static_cast<float>(width) * 0.5f))),
-          hh_(static_cast<std::int64_t>(std::floor(static_cast<float>(height) * 0.5f))),
-          dx_(dx),
-          dy_(dy),
-          a_(static_cast<float>(colour.a) * vorlite::core::k_inv255),
-          limit_(vorlite::core::logf(1.0f / static_cast<float>(colour.a))),
-          sx(dsx * scale),
-          sy(dsy * scale) {
-        const auto hw = static_cast<float>(hw_);
-        const auto hh = static_cast<float>(hh_);
-        if (type == VOR_FLARE_SINC) {
-            kx_ = 2.0f / ((hw + hh) * scale);
-            ky_ = kx_;
-        } else {
-            kx_ = 1.0f / (hw * sx);
-            ky_ = 1.0f / (hh * sy);
-        }
+// The closed-form shapes. Each forms the terms that depend on Y alone once
+// a row; r = X^2 + Y^2 in float. Offsets carrying 0.5, 0.6 or 1.7 and the
+// products they enter are double; everything else is float.
+
+// Rings of light falling off as 1/sqrt(q); the exact centre (q = 0) stays
+// clear.
+struct Sinc {
+    float faint;  // 0.4a
+    float row(float y) const { return y * y; }
+    float operator()(float x, float y2) const {
+        const float q = 80.0f * (x * x + y2);
+        if (q == 0.0f) return 1.0f;
+        return 1.0f - (vorlite::core::sinf(q) / std::sqrt(q)) * faint;
     }
+};
 
-    FlareRow row(std::uint32_t y) const {
-        const float v = (static_cast<float>(static_cast<std::int64_t>(y) - hh_) - static_cast<float>(hh_) * dy_) * ky_;
-        return {v, v - 1.0f, (v - 1.0f) * (v - 1.0f)};
+struct GaussianThingTerms {
+    float y2;
+    double w2;
+};
+
+// e = -2r - 16 (X + 0.5)^2 (Y + 0.5)^2
+struct GaussianThing {
+    FlareLight light;
+    GaussianThingTerms row(float y) const {
+        const double w = static_cast<double>(y) + 0.5;
+        return {y * y, w * w};
     }
-
-    // The blend level at a pixel of the row: trunc((1 - v) x 255) for the
-    // shape's transmission v, held in 0..1 — a sinc's negative lobes
-    // would ask for less than no light, and a blend cannot darken by light.
-    std::uint32_t opacity(const FlareRow& row, std::uint32_t x) const {
-        const float xs = (static_cast<float>(static_cast<std::int64_t>(x) - hw_) - static_cast<float>(hw_) * dx_) * kx_;
-        float v = transmission(xs, row);
-        if (!(v < 1.0f)) return 0;
-        if (v < 0.0f) v = 0.0f;
-        return static_cast<std::uint32_t>((1.0f - v) * 255.0f);
+    float operator()(float x, const GaussianThingTerms& t) const {
+        const double u = static_cast<double>(x) + 0.5;
+        const float r = x * x + t.y2;
+        return flare_from_exponent(static_cast<double>(-2.0f * r) - 16.0 * (u * u) * t.w2, light);
     }
+};
 
-private:
-    // Shapes from a Gaussian exponent e <= 0: invisible where the light
-    // would stay below one level of the colour's alpha (e < ln(1/alpha)).
-    float from_exponent(double e) const {
-        if (e < static_cast<double>(limit_)) return 1.0f;
-        if (e > 0.0) return 1.0f - a_;
-        return 1.0f - vorlite::core::expf(static_cast<float>(e)) * a_;
+// e = -2r - 16 (Y + 1)^2 (X - 0.5)^2; (Y + 1) carries no fraction and
+// stays float until it meets (X - 0.5).
+struct GaussianThing2 {
+    FlareLight light;
+    GaussianThingTerms row(float y) const {
+        const float w = y + 1.0f;
+        return {y * y, static_cast<double>(16.0f * (w * w))};
     }
-
-    float transmission(float x, const FlareRow& row) const {
-        const float y = row.y;
-        const float r = x * x + y * y;
-        switch (type_) {
-            case VOR_FLARE_SINC: {
-                // Rings of light falling off as 1/sqrt(q); the exact centre
-                // (q = 0) stays clear.
-                const float q = 80.0f * r;
-                if (q == 0.0f) return 1.0f;
-                return 1.0f - (vorlite::core::sinf(q) / std::sqrt(q)) * (0.4f * a_);
-            }
-            case VOR_FLARE_GAUSSIAN_THING: {
-                const double u = static_cast<double>(x) + 0.5;
-                const double w = static_cast<double>(y) + 0.5;
-                return from_exponent(static_cast<double>(-2.0f * r) - 16.0 * (u * u) * (w * w));
-            }
-            case VOR_FLARE_GAUSSIAN_THING_2: {
-                const double w = static_cast<double>(y) + 1.0;
-                const double u = static_cast<double>(x) - 0.5;
-                return from_exponent(static_cast<double>(-2.0f * r) - 16.0 * (w * w) * (u * u));
-            }
-            case VOR_FLARE_GAUSSIAN_THING_3: {
-                const double u = static_cast<double>(x) - 0.6;
-                const double w = static_cast<double>(y) + 1.7;
-                return from_exponent(static_cast<double>(-2.0f * r) - (u * u) * (w * w));
-            }
-            case VOR_FLARE_GAUSSIAN_THING_4: {
-                const double u1 = static_cast<double>(x) - 0.6;
-                const double w1 = static_cast<double>(y) + 1.7;
-                const double u2 = static_cast<double>(x) + 0.6;
-                const double w2 = static_cast<double>(y) - 1.7;
-                return from_exponent(-0.5 * ((u1 * u1) * (w1 * w1) + (u2 * u2) * (w2 * w2)));
-            }
-            case VOR_FLARE_STRIPE:
-                return from_exponent(-(x * x + y * y * 0.015625f));
-            case VOR_FLARE_STRIPE_2:
-                return from_exponent(-(x * x * 0.015625f + y * y));
-            case VOR_FLARE_BLOB:
-                return from_exponent(-100.0f * ((r * r) * (r * r)));
-            case VOR_FLARE_BLOB_2:
-                return from_exponent(-10.0f * (r * r));
-            case VOR_FLARE_NONE:
-                return 1.0f;
-            default:
-                return vorlite::generate::designed_flare_transmission(type_, x, row, r, a_, limit_);
-        }
+    float operator()(float x, const GaussianThingTerms& t) const {
+        const double u = static_cast<double>(x) - 0.5;
+        const float r = x * x + t.y2;
+        return flare_from_exponent(static_cast<double>(-2.0f * r) - t.w2 * (u * u), light);
     }
+};
 
-    VorFlareType type_;
-    std::int64_t hw_;
-    std::int64_t hh_;
-    float dx_;
-    float dy_;
-    float a_;
-    float limit_;
-    float kx_ = 0.0f;
-    float ky_ = 0.0f;
+// e = -2r - (X - 0.6)^2 (Y + 1.7)^2
+struct GaussianThing3 {
+    FlareLight light;
+    GaussianThingTerms row(float y) const {
+        const double w = static_cast<double>(y) + 1.7;
+        return {y * y, w * w};
+    }
+    float operator()(float x, const GaussianThingTerms& t) const {
+        const double u = static_cast<double>(x) - 0.6;
+        const float r = x * x + t.y2;
+        return flare_from_exponent(static_cast<double>(-2.0f * r) - (u * u) * t.w2, light);
+    }
+};
 
-public:
-    const float sx;
-    const float sy;
+struct GaussianThing4Terms {
+    double w1_2;
+    double w2_2;
+};
+
+// e = -0.5 ((X - 0.6)^2 (Y + 1.7)^2 + (X + 0.6)^2 (Y - 1.7)^2): two
+// crossed streaks through opposite corners.
+struct GaussianThing4 {
+    FlareLight light;
+    GaussianThing4Terms row(float y) const {
+        const double w1 = static_cast<double>(y) + 1.7;
+        const double w2 = static_cast<double>(y) - 1.7;
+        return {w1 * w1, w2 * w2};
+    }
+    float operator()(float x, const GaussianThing4Terms& t) const {
+        const double u1 = static_cast<double>(x) - 0.6;
+        const double u2 = static_cast<double>(x) + 0.6;
+        return flare_from_exponent(-0.5 * ((u1 * u1) * t.w1_2 + (u2 * u2) * t.w2_2), light);
+    }
+};
+
+// e = -(X^2 + Y^2 / 64): a vertical streak.
+struct Stripe {
+    FlareLight light;
+    float row(float y) const { return y * y * 0.015625f; }
+    float operator()(float x, float y_term) const { return flare_from_exponent(-(x * x + y_term), light); }
+};
+
+// e = -(X^2 / 64 + Y^2): a horizontal streak.
+struct Stripe2 {
+    FlareLight light;
+    float row(float y) const { return y * y; }
+    float operator()(float x, float y2) const { return flare_from_exponent(-(x * x * 0.015625f + y2), light); }
+};
+
+// e = -100 r^4: a disc with a flat top and a short soft edge.
+struct Blob {
+    FlareLight light;
+    float row(float y) const { return y * y; }
+    float operator()(float x, float y2) const {
+        const float r = x * x + y2;
+        return flare_from_exponent(-100.0f * ((r * r) * (r * r)), light);
+    }
+};
+
+// e = -10 r^2
+struct Blob2 {
+    FlareLight light;
+    float row(float y) const { return y * y; }
+    float operator()(float x, float y2) const {
+        const float r = x * x + y2;
+        return flare_from_exponent(-10.0f * (r * r), light);
+    }
+};
+
+// No light: type 8 and the types without a shape.
+struct NoLight {
+    int row(float) const { return 0; }
+    float operator()(float, int) const { return 1.0f; }
 };
 
 struct Range {
@@ -188,6 +201,26 @@ Span span_of(Range range, float scale, float offset, std::uint32_t size) {
     return {pixel_bound(low, size), pixel_bound(high, size)};
 }
 
+bool has_shape(VorFlareType type) {
+    return type >= VOR_FLARE_SINC && type <= VOR_FLARE_BLOB_2 && type != VOR_FLARE_NONE;
+}
+
+void paint_shape(VorFlareType type, const FlareRaster& raster, const FlareLight& light) {
+    switch (type) {
+        case VOR_FLARE_SINC: return paint_flare(raster, Sinc{0.4f * light.a});
+        case VOR_FLARE_GAUSSIAN_THING: return paint_flare(raster, GaussianThing{light});
+        case VOR_FLARE_GAUSSIAN_THING_2: return paint_flare(raster, GaussianThing2{light});
+        case VOR_FLARE_GAUSSIAN_THING_3: return paint_flare(raster, GaussianThing3{light});
+        case VOR_FLARE_GAUSSIAN_THING_4: return paint_flare(raster, GaussianThing4{light});
+        case VOR_FLARE_STRIPE: return paint_flare(raster, Stripe{light});
+        case VOR_FLARE_STRIPE_2: return paint_flare(raster, Stripe2{light});
+        case VOR_FLARE_BLOB: return paint_flare(raster, Blob{light});
+        case VOR_FLARE_BLOB_2: return paint_flare(raster, Blob2{light});
+        default:
+            if (!vorlite::generate::paint_designed_flare(type, raster, light)) paint_flare(raster, NoLight{});
+    }
+}
+
 const char* const k_type_names[] = {
     "sinc", "gaussianThing", "gaussianThing2", "gaussianThing3", "gaussianThing4", "angleGaussian", "stardom",
     "lobes", nullptr, "stripe", "stripe2", "dimondFlare", "crossFlare", "cornerFlares", "fingerFlare",
@@ -202,27 +235,55 @@ VOR_API void VorFlare(VorBitmap* bitmap, float fScale, const VorColor* color, Vo
                       float dy, float dsx, float dsy, uint32_t blendMode) {
     if (color->a == 0 || dsx == 0.0f || dsy == 0.0f || fScale == 0.0f) return;
     if (bitmap->width == 0 || bitmap->height == 0) return;
-    vorlite::core::WorkingArray<VorColorBlendMemoTable> memo;
-    if (!memo.build(1)) return;
-    VorColorBlendInitMemozied(memo.get(), blendMode);
+    // Level 0 gives back the pixel in the modes with a rule, so a shape
+    // without light changes nothing there.
+    const bool level_zero_is_identity = blendMode <= VOR_BLEND_SOFT_LIGHT;
+    if (!has_shape(type) && level_zero_is_identity) return;
 
-    const FlareFrame frame(bitmap->width, bitmap->height, fScale, *color, type, dx, dy, dsx, dsy);
-    const WorkBox box = work_box_of(type);
-    const Span columns = span_of(box.x, frame.sx, dx, bitmap->width);
-    const Span rows = span_of(box.y, frame.sy, dy, bitmap->height);
-    const bool skip_clear = blendMode != VOR_BLEND_COLOR;
-    for (std::uint32_t y = rows.first; y < rows.end; ++y) {
-        const FlareRow row = frame.row(y);
-        std::uint8_t* p = bitmap->data + (static_cast<std::size_t>(y) * bitmap->width + columns.first) * 4;
-        for (std::uint32_t x = columns.first; x < columns.end; ++x, p += 4) {
-            const std::uint32_t level = frame.opacity(row, x);
-            // At level 0 every mode but the colour mode returns the pixel.
-            if (level == 0 && skip_clear) continue;
-            VorColor out = vorlite::core::load_pixel(p);
-            VorColorBlendMemoized(&out, color, level, memo.get());
-            vorlite::core::store_pixel(p, out);
-        }
+    const auto hw = static_cast<std::int64_t>(std::floor(static_cast<float>(bitmap->width) * 0.5f));
+    const auto hh = static_cast<std::int64_t>(std::floor(static_cast<float>(bitmap->height) * 0.5f));
+    const FlareLight light{static_cast<float>(color->a) * vorlite::core::k_inv255,
+                           vorlite::core::logf(1.0f / static_cast<float>(color->a))};
+    const float sx = dsx * fScale;
+    const float sy = dsy * fScale;
+    // The sinc is round whatever the picture's proportions, its unit set by
+    // the overall scale alone; the other shapes fill dsx by dsy.
+    float kx;
+    float ky;
+    if (type == VOR_FLARE_SINC) {
+        kx = 2.0f / (static_cast<float>(hw + hh) * fScale);
+        ky = kx;
+    } else {
+        kx = 1.0f / (static_cast<float>(hw) * sx);
+        ky = 1.0f / (static_cast<float>(hh) * sy);
     }
+
+    const WorkBox box = work_box_of(type);
+    const Span columns = span_of(box.x, sx, dx, bitmap->width);
+    const Span rows = span_of(box.y, sy, dy, bitmap->height);
+    if (columns.first >= columns.end || rows.first >= rows.end) return;
+
+    vorlite::core::WorkingArray<float> column_x;
+    vorlite::core::WorkingArray<VorColorBlendMemoTable> memo;
+    if (!column_x.build(columns.end - columns.first) || !memo.build(1)) return;
+    VorColorBlendInitMemozied(memo.get(), blendMode);
+    const float hw_shift = static_cast<float>(hw) * dx;
+    for (std::uint32_t x = columns.first; x < columns.end; ++x) {
+        column_x[x - columns.first] = (static_cast<float>(static_cast<std::int64_t>(x) - hw) - hw_shift) * kx;
+    }
+    const FlareRaster raster{.bitmap = bitmap,
+                             .colour = color,
+                             .memo = memo.get(),
+                             .x0 = columns.first,
+                             .x1 = columns.end,
+                             .y0 = rows.first,
+                             .y1 = rows.end,
+                             .column_x = column_x.get(),
+                             .hh = hh,
+                             .dy = dy,
+                             .ky = ky,
+                             .level_zero_is_identity = level_zero_is_identity};
+    paint_shape(type, raster, light);
 }
 
 VOR_API int VLPLFlareTypeFromFlareTypeVal(const yajl_val value, VorFlareType* outType) {

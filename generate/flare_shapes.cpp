@@ -1,8 +1,9 @@
-// Flare shapes built from angles, lobes and crossed Gaussians: starbursts,
-// petals, a diamond, a cross, corner glows, a finger of light, a lens
-// ghost and a hazy sunburst. Each is a transmission at shape coordinates,
-// drawn by VorFlare's frame inside the type's work box.
+// Flare shapes built from angles, petals and crossed Gaussians: starbursts,
+// petals, a diamond, a cross, corner glows, a finger of light, a chain of
+// lens ghosts and a hazy sunburst. Each gives a transmission at shape
+// coordinates and is drawn by VorFlare's frame inside the type's work box.
 #include <cmath>
+#include <cstdint>
 
 #include "core/core_internal.h"
 #include "generate/generate_internal.h"
@@ -10,107 +11,220 @@
 namespace vorlite::generate {
 namespace {
 
-// The shared rule of the Gaussian shapes: no light where it would stay
-// below one level of the colour, full colour at or above the centre's.
-float from_exponent(float e, float a, float limit) {
-    if (e < limit) return 1.0f;
-    if (e > 0.0f) return 1.0f - a;
-    return 1.0f - core::expf(e) * a;
-}
+// The direction of (X, Y) as the unit complex number z = e^(i angle),
+// angle = atan2(Y, X), held as its square: z^2 = ((X^2 - Y^2) + 2XY i) / r.
+// Powers of z give sin(4 angle), cos(4 angle) and sin(10 angle) with a few
+// products instead of an arc tangent and a sine per pixel. The centre,
+// where the angle is undefined, counts as angle 0.
+struct Direction {
+    float re2;
+    float im2;
 
-float angle_of(float x, float y) {
-    return static_cast<float>(core::atan2(static_cast<double>(y), static_cast<double>(x)));
-}
+    Direction(float x, float y, float r) {
+        if (r > 0.0f) {
+            const float inv = 1.0f / r;
+            re2 = (x * x - y * y) * inv;
+            im2 = (2.0f * x * y) * inv;
+        } else {
+            re2 = 1.0f;
+            im2 = 0.0f;
+        }
+    }
 
-float square(float v) { return v * v; }
+    // z^4 = (z^2)^2
+    float cos4() const { return re2 * re2 - im2 * im2; }
+    float sin4() const { return 2.0f * re2 * im2; }
 
-// Ten soft rays around a bright core: the falloff along a ray is five
-// times slower than between rays.
-float angle_gaussian(float x, float y, float r, float a, float limit) {
-    // Between the rays the light falls fastest; if even along a ray it is
-    // gone, the angle is not needed.
-    if (-r * 1.0f < limit) return 1.0f;
-    const float rays = 3.0f + 2.0f * core::sinf(10.0f * angle_of(x, y));
-    return from_exponent(-r * rays, a, limit);
-}
+    // z^10 = (z^4)^2 z^2
+    float sin10() const {
+        const float re4 = cos4();
+        const float im4 = sin4();
+        const float re8 = re4 * re4 - im4 * im4;
+        const float im8 = 2.0f * re4 * im4;
+        return re8 * im2 + im8 * re2;
+    }
+};
 
-// A four-pointed star with long thin spikes along the axes over a small
-// round core: sin^2(2 angle) = (1 - cos(4 angle)) / 2 closes the light
-// between the spikes.
-float stardom(float x, float y, float r, float a, float limit) {
-    const float core_glow = -6.0f * r;
-    if (-0.6f * r < limit) return 1.0f;
-    const float between = 0.5f * (1.0f - core::cosf(4.0f * angle_of(x, y)));
-    const float spikes = -r * (0.6f + 25.0f * between);
-    return from_exponent(core_glow > spikes ? core_glow : spikes, a, limit);
-}
+float max_of(float a, float b) { return a > b ? a : b; }
 
-// Four petals of light: a Gaussian whose square, exp(2e), is shaped by the
-// angle directly into the transmission, as the sinc is.
-float lobes(float x, float y, float r, float a) {
-    const float e = -1.2f * r;
-    const float petals = 0.5f + 0.5f * core::sinf(4.0f * angle_of(x, y));
-    return 1.0f - core::expf(2.0f * e) * petals * a;
-}
+// Shapes whose row contributes only Y and Y^2.
+struct RowY {
+    float y;
+    float y2;
+};
 
-// A glow whose contour lines are diamonds: squared taxicab distance.
-float diamond(float x, float y, float a, float limit) {
-    return from_exponent(-4.0f * square(std::fabs(x) + std::fabs(y)), a, limit);
-}
+// Ten soft rays around a bright core: along a ray the light falls as
+// exp(-r), between rays five times faster.
+struct AngleGaussian {
+    FlareLight light;
+    RowY row(float y) const { return {y, y * y}; }
+    float operator()(float x, const RowY& t) const {
+        const float r = x * x + t.y2;
+        // Along a ray the light is brightest: past it, no angle is needed.
+        if (-r < light.limit) return 1.0f;
+        const float rays = 3.0f + 2.0f * Direction(x, t.y, r).sin10();
+        return flare_from_exponent(-r * rays, light);
+    }
+};
 
-// Two long thin streaks crossing at the centre, the brighter of the two.
-float cross(float x, float y, float a, float limit) {
-    const float across = -0.02f * x * x - 60.0f * y * y;
-    const float down = -0.02f * y * y - 60.0f * x * x;
-    return from_exponent(across > down ? across : down, a, limit);
-}
+// A four-pointed star: long thin spikes along the axes over a small round
+// core. sin^2(2 angle) = (1 - cos(4 angle)) / 2 closes the light between
+// the spikes.
+struct Stardom {
+    FlareLight light;
+    RowY row(float y) const { return {y, y * y}; }
+    float operator()(float x, const RowY& t) const {
+        const float r = x * x + t.y2;
+        if (-0.6f * r < light.limit) return 1.0f;
+        const float between = 0.5f * (1.0f - Direction(x, t.y, r).cos4());
+        const float spikes = -r * (0.6f + 25.0f * between);
+        return flare_from_exponent(max_of(-6.0f * r, spikes), light);
+    }
+};
+
+// Four broad petals on the diagonals, grown out of a round glow: the
+// Gaussian's square exp(2e), e = -1.2 r, scaled by 1 + 1.6 r sin(4 angle
+// - pi/2) directly into the transmission, as the sinc is. Towards the
+// axes the factor turns negative; those dark sides get no light.
+struct Lobes {
+    FlareLight light;
+    RowY row(float y) const { return {y, y * y}; }
+    float operator()(float x, const RowY& t) const {
+        const float r = x * x + t.y2;
+        const float glow = -2.4f * r;
+        // The petal factor is at most 1 + 1.6 r < exp(1.6 r).
+        if (glow + 1.6f * r < light.limit) return 1.0f;
+        const float petals = 1.0f - 1.6f * r * Direction(x, t.y, r).cos4();
+        return 1.0f - core::expf(glow) * petals * light.a;
+    }
+};
+
+// A diamond of light: flat inside, with a soft edge, whose contours are
+// squares on their corners (taxicab distance d, e = -3 d^4).
+struct Diamond {
+    FlareLight light;
+    float row(float y) const { return std::fabs(y); }
+    float operator()(float x, float abs_y) const {
+        const float d = std::fabs(x) + abs_y;
+        const float d2 = d * d;
+        return flare_from_exponent(-3.0f * (d2 * d2), light);
+    }
+};
+
+// Two long thin streaks crossing at the centre; the brighter one wins.
+struct Cross {
+    FlareLight light;
+    RowY row(float y) const { return {y, y * y}; }
+    float operator()(float x, const RowY& t) const {
+        const float x2 = x * x;
+        const float across = -0.02f * x2 - 60.0f * t.y2;
+        const float down = -0.02f * t.y2 - 60.0f * x2;
+        return flare_from_exponent(max_of(across, down), light);
+    }
+};
 
 // Glows at the four corners of the flare's square, (+-1, +-1): light
-// leaking in from the corners of a frame when the flare fills the picture.
-float corner_flares(float x, float y, float a, float limit) {
-    const float d = square(std::fabs(x) - 1.0f) + square(std::fabs(y) - 1.0f);
-    return from_exponent(-3.0f * d, a, limit);
+// leaking in at the corners of a frame when the flare fills the picture.
+struct CornerFlares {
+    FlareLight light;
+    float row(float y) const {
+        const float v = std::fabs(y) - 1.0f;
+        return v * v;
+    }
+    float operator()(float x, float v2) const {
+        const float u = std::fabs(x) - 1.0f;
+        return flare_from_exponent(-3.0f * (u * u + v2), light);
+    }
+};
+
+struct FingerRow {
+    float along;        // the exponent along the finger
+    float across_rate;  // 1 / width^2
+};
+
+// A finger of light rising from its base one unit below the centre
+// (Y = 1) and tapering to a rounded tip about one unit above it: brightest
+// at the base, its width shrinking linearly with the height.
+struct Finger {
+    FlareLight light;
+    FingerRow row(float y) const {
+        const float from_base = y - 1.0f;
+        const float height = -from_base;
+        // Below the base the light ends within about half a unit.
+        const float along = from_base > 0.0f ? -14.0f * (from_base * from_base) : -0.8f * (from_base * from_base);
+        const float width = max_of(0.3f - 0.1f * height, 0.05f);
+        return {along, 1.0f / (width * width)};
+    }
+    float operator()(float x, const FingerRow& t) const {
+        if (t.along < light.limit) return 1.0f;
+        return flare_from_exponent(t.along - x * x * t.across_rate, light);
+    }
+};
+
+struct GhostRow {
+    float large;   // (Y + 0.5)^2
+    float medium;  // (Y - 0.3)^2
+    float small;   // (Y - 0.8)^2
+};
+
+// A ghost: a flat disc of the given radius with a short soft edge
+// (e = -2 (d^2 / R^2)^2), its light scaled by exp(gain).
+float ghost(float d2, float inv_r2, float gain) {
+    const float q = d2 * inv_r2;
+    return gain - 2.0f * (q * q);
 }
 
-// A tapering finger of light from the left, rising gently to the right.
-float finger(float x, float y, float a, float limit) {
-    const float along = x + 0.5f;
-    const float tilt = y + 0.3f * along;
-    return from_exponent(-(0.25f * along * along + 12.0f * tilt * tilt), a, limit);
-}
-
-// A lens ghost: a large soft blob and a smaller, sharper one beside it.
-float blob_flare(float x, float y, float a, float limit) {
-    const float large = -6.0f * (square(x + 0.4f) + square(y + 0.4f));
-    const float small = -10.0f * (square(x - 0.5f) + square(y - 0.5f));
-    return from_exponent(large > small ? large : small, a, limit);
-}
+// Lens ghosts in a chain down the diagonal, as a lens images its aperture
+// away from a light: a large dim disc up and to the left, a middle one,
+// and a small bright one down and to the right.
+struct BlobFlare {
+    FlareLight light;
+    GhostRow row(float y) const {
+        const float l = y + 0.5f;
+        const float m = y - 0.3f;
+        const float s = y - 0.8f;
+        return {l * l, m * m, s * s};
+    }
+    float operator()(float x, const GhostRow& t) const {
+        const float l = x + 0.5f;
+        const float m = x - 0.3f;
+        const float s = x - 0.8f;
+        // Radii 0.5, 0.25 and 0.12; gains ln 0.45 and ln 0.7.
+        const float large = ghost(l * l + t.large, 4.0f, -0.7985077f);
+        const float medium = ghost(m * m + t.medium, 16.0f, -0.3566749f);
+        const float small = ghost(s * s + t.small, 69.44444f, 0.0f);
+        return flare_from_exponent(max_of(large, max_of(medium, small)), light);
+    }
+};
 
 // A hazy sunburst over the whole picture: ten faint rays in a wide glow,
-// mixed in at a fifth of the colour's opacity.
-float blah(float x, float y, float r, float a, float limit) {
-    // At a fifth of the opacity the glow is invisible ln 5 sooner.
-    if (-0.5f * r < limit + 1.609438f) return 1.0f;
-    const float glow = core::expf(-0.5f * r);
-    const float rays = 0.6f + 0.4f * core::sinf(10.0f * angle_of(x, y));
-    return 1.0f - glow * rays * (0.2f * a);
-}
+// laid directly into the transmission at a fifth of the colour's opacity.
+struct Blah {
+    FlareLight light;
+    RowY row(float y) const { return {y, y * y}; }
+    float operator()(float x, const RowY& t) const {
+        const float r = x * x + t.y2;
+        // At a fifth of the opacity the glow is gone ln 5 sooner.
+        if (-0.5f * r < light.limit + 1.609438f) return 1.0f;
+        const float rays = 0.6f + 0.4f * Direction(x, t.y, r).sin10();
+        return 1.0f - core::expf(-0.5f * r) * rays * (0.2f * light.a);
+    }
+};
 
 }  // namespace
 
-float designed_flare_transmission(VorFlareType type, float x, const FlareRow& row, float r, float a, float limit) {
-    const float y = row.y;
+bool paint_designed_flare(VorFlareType type, const FlareRaster& raster, const FlareLight& light) {
     switch (type) {
-        case VOR_FLARE_ANGLE_GAUSSIAN: return angle_gaussian(x, y, r, a, limit);
-        case VOR_FLARE_STARDOM: return stardom(x, y, r, a, limit);
-        case VOR_FLARE_LOBES: return lobes(x, y, r, a);
-        case VOR_FLARE_DIAMOND: return diamond(x, y, a, limit);
-        case VOR_FLARE_CROSS: return cross(x, y, a, limit);
-        case VOR_FLARE_CORNERS: return corner_flares(x, y, a, limit);
-        case VOR_FLARE_FINGER: return finger(x, y, a, limit);
-        case VOR_FLARE_BLOB_FLARE: return blob_flare(x, y, a, limit);
-        case VOR_FLARE_BLAH: return blah(x, y, r, a, limit);
-        default: return 1.0f;  // types without a shape give no light
+        case VOR_FLARE_ANGLE_GAUSSIAN: paint_flare(raster, AngleGaussian{light}); return true;
+        case VOR_FLARE_STARDOM: paint_flare(raster, Stardom{light}); return true;
+        case VOR_FLARE_LOBES: paint_flare(raster, Lobes{light}); return true;
+        case VOR_FLARE_DIAMOND: paint_flare(raster, Diamond{light}); return true;
+        case VOR_FLARE_CROSS: paint_flare(raster, Cross{light}); return true;
+        case VOR_FLARE_CORNERS: paint_flare(raster, CornerFlares{light}); return true;
+        case VOR_FLARE_FINGER: paint_flare(raster, Finger{light}); return true;
+        case VOR_FLARE_BLOB_FLARE: paint_flare(raster, BlobFlare{light}); return true;
+        case VOR_FLARE_BLAH: paint_flare(raster, Blah{light}); return true;
+        default: return false;
     }
 }
 

@@ -111,19 +111,78 @@ private:
     float ih_ = 0.0f;
 };
 
-// Flares: the per-row terms of a flare's shape coordinates, formed once a
-// row: y, y - 1 and (y - 1)^2.
-struct FlareRow {
-    float y;
-    float y_minus_1;
-    float y_minus_1_squared;
+// Flares: what a shape needs of its colour. a = alpha / 255 is the light
+// at full strength; limit = ln(1 / alpha) is the exponent below which a
+// Gaussian's light stays under one level of the colour.
+struct FlareLight {
+    float a;
+    float limit;
 };
 
-// Flares: the transmission (1 = no light, 0 = the full colour) of the
-// shapes built from angles, lobes and crossed Gaussians, at shape
-// coordinates (x, row.y) with r = x^2 + y^2, for the colour's opacity a;
-// exponents below limit, ln(1/alpha), are below one level of light.
-float designed_flare_transmission(VorFlareType type, float x, const FlareRow& row, float r, float a, float limit);
+// Flares: the transmission (1 = no light, 0 = the full colour) of a shape
+// whose light is exp(e) with e <= 0: nothing below one level, the full
+// colour at or above the centre's. Real is float or double, as the shape
+// forms its exponent; expf rounds the exponent to float.
+template <typename Real>
+inline float flare_from_exponent(Real e, const FlareLight& light) {
+    if (e < static_cast<Real>(light.limit)) return 1.0f;
+    if (e > static_cast<Real>(0)) return 1.0f - light.a;
+    return 1.0f - core::expf(static_cast<float>(e)) * light.a;
+}
+
+// Flares: the blend level for a transmission v, trunc((1 - v) x 255). A
+// transmission above 1 (the sinc's negative lobes, or the dark sides of a
+// shape whose sines go negative) asks for less than no light: a flare
+// adds light and never darkens, so it gets level 0. One below 0 asks for
+// more than the full colour and gets level 255; NaN gets level 0.
+inline std::uint32_t flare_level(float v) {
+    if (!(v < 1.0f)) return 0;
+    if (v < 0.0f) return 255;
+    return static_cast<std::uint32_t>((1.0f - v) * 255.0f);
+}
+
+// Flares: the pixels a flare visits, its work box [x0, x1) x [y0, y1), and
+// how they map to the shape's coordinates: X of each column of the box
+// (formed once a call) and Y = ((y - hh) - hh x dy) x ky (once a row).
+struct FlareRaster {
+    VorBitmap* bitmap;
+    const VorColor* colour;
+    VorColorBlendMemoTable* memo;
+    std::uint32_t x0, x1, y0, y1;
+    const float* column_x;
+    std::int64_t hh;
+    float dy;
+    float ky;
+    // Level 0 returns the pixel in every mode with a rule, so such pixels
+    // are skipped; a mode without a rule still writes at level 0.
+    bool level_zero_is_identity;
+};
+
+// Flares: paints one shape over the work box, rows top to bottom. A shape
+// forms its own terms of a row once (row(Y)) and gives the transmission
+// at a pixel from X and those terms (operator()).
+template <typename Shape>
+void paint_flare(const FlareRaster& raster, const Shape& shape) {
+    const std::uint32_t width = raster.bitmap->width;
+    const float hh_shift = static_cast<float>(raster.hh) * raster.dy;
+    for (std::uint32_t y = raster.y0; y < raster.y1; ++y) {
+        const float row_y = (static_cast<float>(static_cast<std::int64_t>(y) - raster.hh) - hh_shift) * raster.ky;
+        const auto terms = shape.row(row_y);
+        std::uint8_t* p = raster.bitmap->data + (static_cast<std::size_t>(y) * width + raster.x0) * 4;
+        const float* column_x = raster.column_x;
+        for (std::uint32_t x = raster.x0; x < raster.x1; ++x, p += 4, ++column_x) {
+            const std::uint32_t level = flare_level(shape(*column_x, terms));
+            if (level == 0 && raster.level_zero_is_identity) continue;
+            VorColor out = core::load_pixel(p);
+            VorColorBlendMemoized(&out, raster.colour, level, raster.memo);
+            core::store_pixel(p, out);
+        }
+    }
+}
+
+// Flares: paints the shapes built from angles, petals and crossed
+// Gaussians (types 5, 6, 7 and 11 to 16); false for any other type.
+bool paint_designed_flare(VorFlareType type, const FlareRaster& raster, const FlareLight& light);
 
 }  // namespace vorlite::generate
 

@@ -225,7 +225,8 @@ VOR_API int VLPLRunColorMatrixTransformProcessor(const yajl_val parameters, VorB
  * the strength fades the map and scales alpha. */
 VOR_API int VLPLRunIntensityMapProcessor(const yajl_val parameters, VorBitmap* bitmap,
                                          const VLPLRunOptions* options);
-/* "flare": a light flare. Not in this build yet: returns 0. */
+/* "flare": "color", "blendMode", "type" (a flare keyword), "dx", "dy", "dsx",
+ * "dsy", "fScale", all required; the strength scales the colour's alpha. */
 VOR_API int VLPLRunFlareProcessor(const yajl_val parameters, VorBitmap* bitmap,
                                   const VLPLRunOptions* options);
 /* "contrast": "value" (number), the S-curve exponent, pulled toward 1 by
