@@ -55,7 +55,7 @@ struct BatchArgs {
 // Contact sheets of every border style, flare type and gradient shape.
 struct GalleryArgs {
     std::filesystem::path output_dir;
-    std::optional<std::filesystem::path> photo;  // a built-in scene when absent
+    std::optional<std::filesystem::path> photo;  // the demo's sample photo, or a built-in scene, when absent
 };
 
 int run_apply(const ApplyArgs& args);

@@ -22,13 +22,16 @@ constexpr uint32_t k_margin = 8;
 constexpr int k_font_scale = 2;
 constexpr uint32_t k_label_height = k_glyph_height * k_font_scale + 8;
 
+// The sample photo the demo unpacks, relative to the repository root.
+const std::filesystem::path k_default_photo = "build/photos/coffee.png";
+
 struct Sample {
     std::string label;
     std::function<void(VorBitmap*)> draw;
 };
 
-// A stand-in photo when none is given: sky, sun and hills, so that light
-// and dark effects both show.
+// A stand-in photo when none is given and the sample photo is absent: sky,
+// sun and hills, so that light and dark effects both show.
 Image synthetic_scene(uint32_t width, uint32_t height) {
     Image scene(width, height);
     for (uint32_t y = 0; y < height; ++y) {
@@ -82,7 +85,9 @@ Image tile_of(const Image& photo) {
     return tile;
 }
 
-void draw_label(Image& sheet, uint32_t left, uint32_t top, const std::string& text) {
+// Dark text from (left, top), cut off at right so that a label never runs
+// into the next tile's.
+void draw_label(Image& sheet, uint32_t left, uint32_t top, uint32_t right, const std::string& text) {
     uint32_t x = left;
     for (const char c : text) {
         for (int row = 0; row < k_glyph_height; ++row) {
@@ -92,7 +97,7 @@ void draw_label(Image& sheet, uint32_t left, uint32_t top, const std::string& te
                     for (int dx = 0; dx < k_font_scale; ++dx) {
                         const uint32_t px = x + static_cast<uint32_t>(column * k_font_scale + dx);
                         const uint32_t py = top + static_cast<uint32_t>(row * k_font_scale + dy);
-                        if (px >= sheet.width || py >= sheet.height) continue;
+                        if (px >= right || py >= sheet.height) continue;
                         uint8_t* p = sheet.pixel(px, py);
                         p[0] = p[1] = p[2] = 30;
                     }
@@ -125,7 +130,7 @@ Image contact_sheet(const Image& tile, const std::vector<Sample>& samples) {
                 to[3] = 255;
             }
         }
-        draw_label(sheet, left, top + drawn.height + 4, samples[i].label);
+        draw_label(sheet, left, top + drawn.height + 4, left + drawn.width, samples[i].label);
     }
     return sheet;
 }
@@ -191,32 +196,69 @@ void draw_border(VorBitmap* bitmap, VorBorderStyle style, bool instant) {
     }
 }
 
+// "7 bulge": the value a caller passes and the keyword a document uses.
+std::string numbered(int32_t value, const char* keyword) { return std::to_string(value) + " " + keyword; }
+
 std::vector<Sample> border_samples() {
-    const char* names[] = {"halftone", "lines", "smooth", "shadow", "fade", "rough", "bulge", "torn",
-                           "torn_2", "rect", "round", "glimmo", "hard_rand", "instant", "vignette", "viewfinder"};
+    const char* keywords[] = {"halftone", "lines", "smooth", "shadow", "fade",     "rough",   "bulge",     "torn",
+                              "torn_2",   "rect",  "round",  "glimmo", "hard_rand", "instant", "vignette", "viewfinder"};
     std::vector<Sample> samples;
     for (int32_t style = 1; style <= 16; ++style) {
+        // VorBorders draws nothing for "instant": its print has its own entry point.
         const bool instant = style == VOR_BORDER_INSTANT;
-        samples.push_back({names[style - 1], [style, instant](VorBitmap* b) { draw_border(b, style, instant); }});
+        samples.push_back({numbered(style, keywords[style - 1]),
+                           [style, instant](VorBitmap* b) { draw_border(b, style, instant); }});
     }
     return samples;
 }
 
+// One flare of each type, placed and sized so that its shape fills a good
+// part of the tile: the compact shapes near the middle and larger, the
+// whole-image ones as they come. Suns and stars are warm white, lens
+// ghosts a cool tint, light leaks orange.
+struct FlareSetting {
+    int32_t type;
+    const char* keyword;
+    float dx, dy, size, scale;
+    VorColor color;
+};
+
+constexpr VorColor k_sun{255, 240, 210, 255};
+constexpr VorColor k_ghost{170, 210, 255, 230};
+constexpr VorColor k_leak{255, 170, 80, 235};
+
+constexpr FlareSetting k_flares[] = {
+    {VOR_FLARE_SINC, "sinc", 0.0f, 0.0f, 1.0f, 0.6f, k_sun},
+    {VOR_FLARE_GAUSSIAN_THING, "gaussianThing", 0.2f, 0.1f, 0.8f, 1.0f, k_sun},
+    {VOR_FLARE_GAUSSIAN_THING_2, "gaussianThing2", 0.2f, 0.1f, 0.8f, 1.0f, k_sun},
+    {VOR_FLARE_GAUSSIAN_THING_3, "gaussianThing3", 0.0f, 0.1f, 0.8f, 1.0f, k_sun},
+    {VOR_FLARE_GAUSSIAN_THING_4, "gaussianThing4", 0.0f, 0.0f, 0.45f, 1.0f, k_sun},
+    {VOR_FLARE_ANGLE_GAUSSIAN, "angleGaussian", 0.3f, -0.4f, 0.5f, 1.0f, k_sun},
+    {VOR_FLARE_STARDOM, "stardom", 0.3f, -0.4f, 0.5f, 1.0f, k_sun},
+    {VOR_FLARE_LOBES, "lobes", 0.0f, 0.0f, 0.6f, 1.0f, k_sun},
+    {VOR_FLARE_NONE, "(no keyword)", 0.0f, 0.0f, 0.6f, 1.0f, k_sun},
+    {VOR_FLARE_STRIPE, "stripe", -0.4f, 0.0f, 0.35f, 1.0f, k_leak},
+    {VOR_FLARE_STRIPE_2, "stripe2", 0.0f, -0.5f, 0.35f, 1.0f, k_leak},
+    {VOR_FLARE_DIAMOND, "dimondFlare", 0.0f, 0.0f, 0.6f, 1.0f, k_ghost},
+    {VOR_FLARE_CROSS, "crossFlare", 0.3f, -0.4f, 0.5f, 1.0f, k_sun},
+    {VOR_FLARE_CORNERS, "cornerFlares", 0.0f, 0.0f, 0.5f, 1.0f, k_leak},
+    {VOR_FLARE_FINGER, "fingerFlare", 0.0f, 0.0f, 0.5f, 1.0f, k_leak},
+    {VOR_FLARE_BLOB_FLARE, "blobFlare", 0.0f, 0.0f, 0.6f, 1.0f, k_ghost},
+    {VOR_FLARE_BLAH, "blah", -0.5f, -0.6f, 0.8f, 1.0f, k_sun},
+    {VOR_FLARE_BLOB, "blob", 0.0f, 0.0f, 0.7f, 1.0f, k_ghost},
+    {VOR_FLARE_BLOB_2, "blob2", 0.0f, 0.0f, 0.7f, 1.0f, k_ghost},
+};
+
 std::vector<Sample> flare_samples() {
-    const char* names[] = {"sinc", "gaussianThing", "gaussianThing2", "gaussianThing3", "gaussianThing4",
-                           "angleGaussian", "stardom", "lobes", "type 8", "stripe", "stripe2", "dimondFlare",
-                           "crossFlare", "cornerFlares", "fingerFlare", "blobFlare", "blah", "blob", "blob2"};
     std::vector<Sample> samples;
-    for (int32_t type = 0; type <= 18; ++type) {
-        samples.push_back({names[type], [type](VorBitmap* b) {
-                               const VorColor warm{255, 222, 170, 235};
-                               VorFlare(b, 1.0f, &warm, type, 0.2f, -0.2f, 0.5f, 0.5f, VOR_BLEND_SCREEN);
+    for (const FlareSetting& f : k_flares) {
+        samples.push_back({numbered(f.type, f.keyword), [f](VorBitmap* b) {
+                               VorFlare(b, f.scale, &f.color, f.type, f.dx, f.dy, f.size, f.size, VOR_BLEND_SCREEN);
                            }});
     }
     samples.push_back({"ring", [](VorBitmap* b) {
-                           const VorColor cool{190, 220, 255, 200};
                            const float size = static_cast<float>(b->width + b->height);
-                           VorRingFlare(b, 0.4f * b->width, 0.45f * b->height, 0.08f * size, &cool, VOR_BLEND_SCREEN);
+                           VorRingFlare(b, 0.4f * b->width, 0.45f * b->height, 0.08f * size, &k_ghost, VOR_BLEND_SCREEN);
                        }});
     samples.push_back({"corvale", [](VorBitmap* b) {
                            VLPLRunOptions o;
@@ -251,15 +293,26 @@ void draw_gradient(VorBitmap* bitmap, int32_t shape) {
 }
 
 std::vector<Sample> gradient_samples() {
-    return {{"linear", [](VorBitmap* b) { draw_gradient(b, VOR_GRADIENT_LINEAR); }},
-            {"radial", [](VorBitmap* b) { draw_gradient(b, VOR_GRADIENT_RADIAL); }},
-            {"linearVignette", [](VorBitmap* b) { draw_gradient(b, VOR_GRADIENT_LINEAR_VIGNETTE); }}};
+    const char* keywords[] = {"linear", "radial", "linearVignette"};
+    std::vector<Sample> samples;
+    for (int32_t shape = VOR_GRADIENT_LINEAR; shape <= VOR_GRADIENT_LINEAR_VIGNETTE; ++shape) {
+        samples.push_back({numbered(shape, keywords[shape]), [shape](VorBitmap* b) { draw_gradient(b, shape); }});
+    }
+    return samples;
 }
 
 }  // namespace
 
 int run_gallery(const GalleryArgs& args) {
-    const Image photo = args.photo ? read_image(*args.photo) : synthetic_scene(960, 640);
+    if (args.photo) require_format(*args.photo);
+    Image photo;
+    if (args.photo) {
+        photo = read_image(*args.photo);
+    } else if (std::filesystem::exists(k_default_photo)) {
+        photo = read_image(k_default_photo);
+    } else {
+        photo = synthetic_scene(960, 640);
+    }
     std::error_code error;
     std::filesystem::create_directories(args.output_dir, error);
     if (error) throw Failure(args.output_dir.string() + ": cannot create the folder (" + error.message() + ")");

@@ -1,5 +1,5 @@
-// A 5 x 7 pixel font for the gallery's labels: letters, digits, '_' and
-// '-'. Each glyph is seven rows of five cells, '#' set.
+// A 5 x 7 pixel font for the gallery's labels: letters, digits, '_', '-'
+// and parentheses. Each glyph is seven rows of five cells, '#' set.
 #include "label_font.h"
 
 namespace vorlite::cli {
@@ -75,6 +75,8 @@ constexpr Glyph k_glyphs[] = {
     {'9', ".###.#...##...#.####....#...#..##.."},
     {'_', "..............................#####"},
     {'-', "................###................"},
+    {'(', "...#...#...#....#....#.....#.....#."},
+    {')', ".#.....#.....#....#....#...#...#..."},
 
 };
 

@@ -123,7 +123,11 @@ int main(int argc, char** argv) {
     gallery->add_option("OUTDIR", gallery_args.output_dir,
                         "folder for borders.png, flares.png and gradients.png (created if missing)")
         ->required();
-    gallery->add_option("--photo", gallery_args.photo, "photo to draw on (default: a built-in scene)");
+    gallery->add_option("--photo", gallery_args.photo,
+                        "photo to draw on, .png, .jpg or .jpeg (default: build/photos/coffee.png, the demo's sample, "
+                        "when it is there, else a built-in scene)");
+    gallery->footer("Each tile is the photo scaled to 320 pixels wide with the effect drawn at that size, "
+                    "labelled with the value and keyword a document or caller uses.");
 
     CLI::App* info = app.add_subcommand("info", "Show the library and document-format versions and the processors");
 
