@@ -290,8 +290,8 @@ TEST(RingFlare, LightsOnlyItsBoundingBox) {
 
 TEST(PresetFlares, SeededWeighedByStrengthAndLocked) {
     using Preset = void (*)(VorBitmap*, const VLPLRunOptions*);
-    const std::pair<Preset, uint32_t> presets[] = {{VorFlareLegacyCorvale, 3757588115u},
-                                                   {VorFlareLegacyEmberly, 3558511737u}};
+    const std::pair<Preset, uint32_t> presets[] = {{VorFlareLegacyCorvale, 4270743521u},
+                                                   {VorFlareLegacyEmberly, 3796315579u}};
     for (const auto& [preset, sum] : presets) {
         TestBitmap one(64, 48), two(64, 48), none(64, 48);
         const VLPLRunOptions o = vorlite::test::run_options(0.8, 12);
@@ -303,6 +303,15 @@ TEST(PresetFlares, SeededWeighedByStrengthAndLocked) {
         const VLPLRunOptions off = vorlite::test::run_options(0.0, 12);
         preset(none.get(), &off);
         EXPECT_TRUE(none.unchanged());
+        // The seed places the light: some seed puts it elsewhere.
+        bool moved = false;
+        for (uint32_t seed = 0; seed < 8 && !moved; ++seed) {
+            TestBitmap other(64, 48);
+            const VLPLRunOptions s = vorlite::test::run_options(0.8, seed);
+            preset(other.get(), &s);
+            moved = other.bytes != one.bytes;
+        }
+        EXPECT_TRUE(moved);
     }
 }
 
