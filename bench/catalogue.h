@@ -66,6 +66,21 @@ inline constexpr double kSharpenGrowthGoal = 1.5;
 // per pixel on the small one.
 inline constexpr double kSizeGrowthGoal = 1.3;
 
+// The generated effects (vignette, gradients, frames, flares), named by
+// these prefixes, have a table of their own: each row against memcpy of the
+// same bytes, measured in the same run under the vignette's name.
+inline constexpr const char* kGeneratedPrefixes[] = {"vignette", "gradient", "border_", "flare"};
+inline constexpr const char* kGeneratedFloor = "vignette";
+
+// A flare visits only its work box. Each flare type is drawn again at half
+// its size on the large bitmap (operation name + kHalfSizeSuffix), where its
+// box is about a quarter as large; its time per box pixel (the counter
+// kBoxPixelsCounter holds the box's pixel count) should not grow by more
+// than this factor.
+inline constexpr const char* kHalfSizeSuffix = "_half";
+inline constexpr const char* kBoxPixelsCounter = "box_pixels";
+inline constexpr double kFlareBoxGoal = 1.3;
+
 // Peak resident memory of the command-line tool over the decoded bitmap.
 inline constexpr double kMemoryGoal = 3.0;
 

@@ -1,5 +1,7 @@
 #include "report.h"
 
+#include <algorithm>
+#include <cctype>
 #include <cstdio>
 #include <memory>
 #include <set>
@@ -102,6 +104,64 @@ std::vector<std::string> our_operations(const Run& run) {
         const std::string operation = k.substr(0, first);
         if (seen.insert(operation).second) operations.push_back(operation);
     }
+    return operations;
+}
+
+// The index of the generated family an operation belongs to, or -1.
+int generated_family(const std::string& operation) {
+    int index = 0;
+    for (const char* prefix : kGeneratedPrefixes) {
+        if (operation.rfind(prefix, 0) == 0) return index;
+        ++index;
+    }
+    return -1;
+}
+
+bool is_generated(const std::string& operation) { return generated_family(operation) >= 0; }
+
+bool is_half_size(const std::string& operation) {
+    const std::string suffix = kHalfSizeSuffix;
+    return operation.size() > suffix.size() &&
+           operation.compare(operation.size() - suffix.size(), suffix.size(), suffix) == 0;
+}
+
+// "flare2" before "flare10": runs of digits compare by their value.
+bool natural_less(const std::string& a, const std::string& b) {
+    size_t i = 0;
+    size_t j = 0;
+    while (i < a.size() && j < b.size()) {
+        if (std::isdigit(static_cast<unsigned char>(a[i])) && std::isdigit(static_cast<unsigned char>(b[j]))) {
+            size_t i_end = i;
+            size_t j_end = j;
+            while (i_end < a.size() && std::isdigit(static_cast<unsigned char>(a[i_end]))) ++i_end;
+            while (j_end < b.size() && std::isdigit(static_cast<unsigned char>(b[j_end]))) ++j_end;
+            const std::string x = a.substr(i, i_end - i);
+            const std::string y = b.substr(j, j_end - j);
+            if (x.size() != y.size()) return x.size() < y.size();
+            if (x != y) return x < y;
+            i = i_end;
+            j = j_end;
+        } else {
+            if (a[i] != b[j]) return a[i] < b[j];
+            ++i;
+            ++j;
+        }
+    }
+    return a.size() - i < b.size() - j;
+}
+
+// The generated effects measured in the run, family by family, each family
+// in natural name order; the half-size flares are left to the flare table.
+std::vector<std::string> generated_operations(const Run& run) {
+    std::vector<std::string> operations;
+    for (const std::string& operation : our_operations(run)) {
+        if (is_generated(operation) && !is_half_size(operation)) operations.push_back(operation);
+    }
+    std::sort(operations.begin(), operations.end(), [](const std::string& a, const std::string& b) {
+        const int fa = generated_family(a);
+        const int fb = generated_family(b);
+        return fa != fb ? fa < fb : natural_less(a, b);
+    });
     return operations;
 }
 
@@ -212,12 +272,72 @@ void solo_table(std::ostringstream& out, const Inputs& in) {
     out << "| operation | " << kSmall.label << " ns/px | " << kLarge.label << " ns/px | " << kLarge.label
         << " ms |\n|---|---:|---:|---:|\n";
     for (const std::string& operation : our_operations(in.single)) {
-        if (in_pairs(operation) || is_document(operation)) continue;
+        if (in_pairs(operation) || is_document(operation) || is_generated(operation)) continue;
         const Median* small = find(in.single, key(operation, kOurs, kSmall));
         const Median* large = find(in.single, key(operation, kOurs, kLarge));
         const std::string& label = large != nullptr ? large->label : small->label;
         out << "| " << label << " | " << per_pixel(small) << " | " << per_pixel(large) << " | "
             << large_ms(large) << " |\n";
+    }
+    out << "\n";
+}
+
+// Each generated effect with its time against memcpy of the same bytes.
+void generated_table(std::ostringstream& out, const Inputs& in) {
+    const std::vector<std::string> operations = generated_operations(in.single);
+    if (operations.empty()) return;
+    const Median* floor_small = find(in.single, key(kGeneratedFloor, "memcpy", kSmall));
+    const Median* floor_large = find(in.single, key(kGeneratedFloor, "memcpy", kLarge));
+    out << "## Generated effects\n\n";
+    out << "Each effect drawn alone on the photo; memcpy of the same bytes is " << per_pixel(floor_small)
+        << " ns per pixel at " << kSmall.label << " and " << per_pixel(floor_large) << " at " << kLarge.label
+        << " in this run. Their growth with size is judged in the growth table.\n\n";
+    out << "| operation | " << kSmall.label << " ns/px | " << kLarge.label << " ns/px | " << kLarge.label
+        << " ms | over memcpy, " << kSmall.label << " | over memcpy, " << kLarge.label << " | " << kLarge.label
+        << " / " << kSmall.label << " |\n|---|---:|---:|---:|---:|---:|---:|\n";
+    for (const std::string& operation : operations) {
+        const Median* small = find(in.single, key(operation, kOurs, kSmall));
+        const Median* large = find(in.single, key(operation, kOurs, kLarge));
+        const Median* any = large != nullptr ? large : small;
+        double r = 0.0;
+        const std::string over_small = cpu_ratio(small, floor_small, r) ? fixed(r, 2) : "n/a";
+        const std::string over_large = cpu_ratio(large, floor_large, r) ? fixed(r, 2) : "n/a";
+        const std::string growth = cpu_ratio(large, small, r) ? fixed(r, 2) : "n/a";
+        out << "| " << any->label << " | " << per_pixel(small) << " | " << per_pixel(large) << " | "
+            << large_ms(large) << " | " << over_small << " | " << over_large << " | " << growth << " |\n";
+    }
+    out << "\n";
+}
+
+// A flare's time per pixel of its work box, at its size and at half of it.
+void flare_box_table(std::ostringstream& out, const Inputs& in) {
+    std::vector<std::pair<const Median*, const Median*>> rows;
+    for (const std::string& operation : generated_operations(in.single)) {
+        const Median* full = find(in.single, key(operation, kOurs, kLarge));
+        const Median* half = find(in.single, key(operation + kHalfSizeSuffix, kOurs, kLarge));
+        if (full != nullptr && half != nullptr && full->box_pixels > 0.0 && half->box_pixels > 0.0) {
+            rows.emplace_back(full, half);
+        }
+    }
+    if (rows.empty()) return;
+    out << "## Flares and their work boxes\n\n";
+    out << "Each flare is drawn centred on the " << kLarge.label << " photo at its size and at half of it, where "
+        << "its work box (the area the type may light, as documented) is about a quarter as large. Time per box "
+        << "pixel is the median time over the box's pixel count; where the box shrinks, that time should not "
+        << "grow: the cost follows the box, not the photo. A box of the whole photo at both sizes has nothing "
+        << "to follow.\n\n";
+    out << "| flare | box, share of the photo | ns per box pixel | half size: box share | ns per box pixel | "
+        << "half over full | goal | met |\n|---|---:|---:|---:|---:|---:|---:|---|\n";
+    for (const auto& [full, half] : rows) {
+        const double full_ns = full->cpu_ns_per_pixel * full->pixels / full->box_pixels;
+        const double half_ns = half->cpu_ns_per_pixel * half->pixels / half->box_pixels;
+        const double r = half_ns / full_ns;
+        const bool judged = half->box_pixels < full->box_pixels;
+        out << "| " << full->label << " | " << fixed(100.0 * full->box_pixels / full->pixels, 1) << " % | "
+            << fixed(full_ns, 2) << " | " << fixed(100.0 * half->box_pixels / half->pixels, 1) << " % | "
+            << fixed(half_ns, 2) << " | " << fixed(r, 2) << " | "
+            << (judged ? "<= " + fixed(kFlareBoxGoal, 2) : std::string("-")) << " | "
+            << (judged ? met(r <= kFlareBoxGoal) : std::string("-")) << " |\n";
     }
     out << "\n";
 }
@@ -302,7 +422,9 @@ bool read_run(const std::string& json, Run& run, std::string& error) {
             continue;
         }
         if (number_field(entry, "repetitions", repetitions)) run.repetitions = static_cast<int>(repetitions);
-        run.medians[k] = Median{cpu_time * scale / pixels, real_time * scale / pixels, pixels,
+        double box_pixels = 0.0;
+        number_field(entry, kBoxPixelsCounter, box_pixels);
+        run.medians[k] = Median{cpu_time * scale / pixels, real_time * scale / pixels, pixels, box_pixels,
                                 string_field(entry, "label")};
     }
     return true;
@@ -314,6 +436,8 @@ std::string render(const Inputs& inputs) {
     pairs_table(out, inputs);
     growth_table(out, inputs);
     solo_table(out, inputs);
+    generated_table(out, inputs);
+    flare_box_table(out, inputs);
     document_table(out, inputs);
     memory_section(out, inputs);
     return out.str();

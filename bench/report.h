@@ -15,6 +15,7 @@ struct Median {
     double cpu_ns_per_pixel = 0.0;
     double wall_ns_per_pixel = 0.0;
     double pixels = 0.0;
+    double box_pixels = 0.0;  // the work box's pixels, for the operations that have one
     std::string label;
 };
 

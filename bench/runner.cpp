@@ -10,8 +10,9 @@ std::string benchmark_name(const std::string& operation, const std::string& side
     return operation + "/" + side + "/" + size.label;
 }
 
-void add_benchmark(const std::string& operation, const std::string& side, const BitmapSize& size,
-                   const std::string& label, std::function<void(benchmark::State&)> body) {
+benchmark::internal::Benchmark* add_benchmark(const std::string& operation, const std::string& side,
+                                              const BitmapSize& size, const std::string& label,
+                                              std::function<void(benchmark::State&)> body) {
     const double pixels = static_cast<double>(size.width) * size.height;
     auto* registered = benchmark::RegisterBenchmark(
         benchmark_name(operation, side, size).c_str(),
@@ -25,7 +26,7 @@ void add_benchmark(const std::string& operation, const std::string& side, const 
     // share the machine; wall-clock time is what a caller waits for when a
     // peer uses every core. A 12-megapixel call takes tens to hundreds of
     // milliseconds, so a few iterations per repetition are enough.
-    registered->MeasureProcessCPUTime()->UseRealTime()->Unit(benchmark::kMillisecond)->MinTime(
+    return registered->MeasureProcessCPUTime()->UseRealTime()->Unit(benchmark::kMillisecond)->MinTime(
         size.width == kLarge.width ? 0.3 : 0.2);
 }
 

@@ -20,6 +20,7 @@ struct Entry {
     double pixels;
     std::string label;
     bool error = false;
+    double box_pixels = 0.0;  // the work-box counter, when the benchmark sets one
 };
 
 std::string json(const std::vector<Entry>& entries) {
@@ -32,7 +33,9 @@ std::string json(const std::vector<Entry>& entries) {
             << e.run_name << R"(", "run_type": ")" << (e.aggregate.empty() ? "iteration" : "aggregate")
             << R"(", "repetitions": 5, "aggregate_name": ")" << e.aggregate << R"(", "real_time": )" << e.real
             << R"(, "cpu_time": )" << e.cpu << R"(, "time_unit": ")" << e.unit << R"(", "pixels": )" << e.pixels
-            << R"(, "label": ")" << e.label << "\"" << (e.error ? R"(, "error_occurred": true)" : "") << "}";
+            << R"(, "label": ")" << e.label << "\"" << (e.error ? R"(, "error_occurred": true)" : "");
+        if (e.box_pixels > 0.0) out << R"(, "box_pixels": )" << e.box_pixels;
+        out << "}";
     }
     out << "]}";
     return out.str();
@@ -141,6 +144,48 @@ TEST(BenchReport, FlagsGrowthWithSizeAndWithAmount) {
     // Clarity has no peer; the sharpening amounts belong to the growth check.
     EXPECT_NE(line_with(text, {"| VorEnhanceClarity |"}).find("| 2.00 | 3.00 | 36.0 |"), std::string::npos);
     EXPECT_EQ(line_with(text, {"| amount 400 |"}), "");
+}
+
+TEST(BenchReport, GeneratedEffectsAgainstMemcpyAndFlaresAgainstTheirBoxes) {
+    report::Inputs inputs;
+    inputs.single = parsed({
+        {"vignette/memcpy/1MP", "median", 0.5, 0.5, "ms", 1e6, "memcpy"},
+        {"vignette/memcpy/12MP", "median", 12.0, 12.0, "ms", 12e6, "memcpy"},
+        {"flare10/ours/1MP", "median", 2.0, 2.0, "ms", 1e6, "stripe2"},
+        {"flare10/ours/12MP", "median", 24.0, 24.0, "ms", 12e6, "stripe2", false, 6e6},
+        {"flare10_half/ours/12MP", "median", 12.0, 12.0, "ms", 12e6, "stripe2, half", false, 3e6},
+        {"flare2/ours/12MP", "median", 40.0, 40.0, "ms", 12e6, "gaussianThing2", false, 4e6},
+        {"flare2_half/ours/12MP", "median", 20.0, 20.0, "ms", 12e6, "gaussianThing2, half", false, 1e6},
+        {"flare5/ours/12MP", "median", 60.0, 60.0, "ms", 12e6, "angleGaussian", false, 12e6},
+        {"flare5_half/ours/12MP", "median", 30.0, 30.0, "ms", 12e6, "angleGaussian, half", false, 12e6},
+        {"border_rough/ours/12MP", "median", 36.0, 36.0, "ms", 12e6, "rough frame"},
+        {"vignette/ours/12MP", "median", 30.0, 30.0, "ms", 12e6, "vignette"},
+    });
+    const std::string text = report::render(inputs);
+
+    // Families in their order, numbers by value; ratios over memcpy of each size.
+    const size_t vignette = text.find("| vignette |");
+    const size_t rough = text.find("| rough frame |");
+    const size_t second = text.find("| gaussianThing2 |");
+    const size_t tenth = text.find("| stripe2 |");
+    ASSERT_NE(vignette, std::string::npos);
+    EXPECT_LT(vignette, rough);
+    EXPECT_LT(rough, second);
+    EXPECT_LT(second, tenth);
+    EXPECT_NE(line_with(text, {"| vignette |"}).find("| n/a | 2.50 | 30.0 | n/a | 2.50 | n/a |"), std::string::npos);
+    EXPECT_NE(line_with(text, {"| stripe2 |"}).find("| 2.00 | 2.00 | 24.0 | 4.00 | 2.00 | 1.00 |"),
+              std::string::npos);
+    // Not listed again among the operations without a peer.
+    EXPECT_EQ(text.find("| rough frame |"), text.rfind("| rough frame |"));
+
+    // Per box pixel: half the box at half the time holds, a quarter of the
+    // box at half the time does not; a whole-image box is not judged.
+    EXPECT_NE(line_with(text, {"| stripe2 |", "%"}).find("| 50.0 % | 4.00 | 25.0 % | 4.00 | 1.00 | <= 1.30 | yes |"),
+              std::string::npos);
+    EXPECT_NE(line_with(text, {"| gaussianThing2 |", "%"}).find("| 10.00 | 8.3 % | 20.00 | 2.00 | <= 1.30 | **no** |"),
+              std::string::npos);
+    EXPECT_NE(line_with(text, {"| angleGaussian |", "%"}).find("| 100.0 % | 5.00 | 100.0 % | 2.50 | 0.50 | - | - |"),
+              std::string::npos);
 }
 
 TEST(BenchReport, ListsTheDocumentStepsBeforeTheirTotal) {
