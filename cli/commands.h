@@ -56,6 +56,8 @@ struct BatchArgs {
 struct GalleryArgs {
     std::filesystem::path output_dir;
     std::optional<std::filesystem::path> photo;  // the demo's sample photo, or a built-in scene, when absent
+    std::optional<uint32_t> width;               // each sheet scaled down to this width
+    std::string format = "png";                  // "png" or "jpg"
 };
 
 int run_apply(const ApplyArgs& args);

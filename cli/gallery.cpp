@@ -60,16 +60,16 @@ Image synthetic_scene(uint32_t width, uint32_t height) {
     return scene;
 }
 
-// Area-average downscale to the tile width (never up).
-Image tile_of(const Image& photo) {
-    if (photo.width <= k_tile_width) return photo;
-    const double step = static_cast<double>(photo.width) / k_tile_width;
+// Area-average downscale to the given width (never up).
+Image scaled_down(const Image& photo, uint32_t width) {
+    if (photo.width <= width) return photo;
+    const double step = static_cast<double>(photo.width) / width;
     const auto height = std::max<uint32_t>(1, static_cast<uint32_t>(photo.height / step));
-    Image tile(k_tile_width, height);
+    Image scaled(width, height);
     for (uint32_t y = 0; y < height; ++y) {
         const auto y0 = static_cast<uint32_t>(y * step);
         const auto y1 = std::min(photo.height, std::max(y0 + 1, static_cast<uint32_t>((y + 1) * step)));
-        for (uint32_t x = 0; x < k_tile_width; ++x) {
+        for (uint32_t x = 0; x < width; ++x) {
             const auto x0 = static_cast<uint32_t>(x * step);
             const auto x1 = std::min(photo.width, std::max(x0 + 1, static_cast<uint32_t>((x + 1) * step)));
             uint32_t sum[4] = {0, 0, 0, 0};
@@ -79,10 +79,10 @@ Image tile_of(const Image& photo) {
                 }
             }
             const uint32_t n = (y1 - y0) * (x1 - x0);
-            for (int c = 0; c < 4; ++c) tile.pixel(x, y)[c] = static_cast<uint8_t>(sum[c] / n);
+            for (int c = 0; c < 4; ++c) scaled.pixel(x, y)[c] = static_cast<uint8_t>(sum[c] / n);
         }
     }
-    return tile;
+    return scaled;
 }
 
 // Dark text from (left, top), cut off at right so that a label never runs
@@ -316,12 +316,13 @@ int run_gallery(const GalleryArgs& args) {
     std::error_code error;
     std::filesystem::create_directories(args.output_dir, error);
     if (error) throw Failure(args.output_dir.string() + ": cannot create the folder (" + error.message() + ")");
-    const Image tile = tile_of(photo);
+    const Image tile = scaled_down(photo, k_tile_width);
     const std::pair<const char*, std::vector<Sample>> families[] = {
-        {"borders.png", border_samples()}, {"flares.png", flare_samples()}, {"gradients.png", gradient_samples()}};
+        {"borders", border_samples()}, {"flares", flare_samples()}, {"gradients", gradient_samples()}};
     for (const auto& [name, samples] : families) {
-        const std::filesystem::path out = args.output_dir / name;
-        write_image(contact_sheet(tile, samples), out, kDefaultQuality);
+        const std::filesystem::path out = args.output_dir / (std::string(name) + "." + args.format);
+        const Image sheet = contact_sheet(tile, samples);
+        write_image(args.width ? scaled_down(sheet, *args.width) : sheet, out, kDefaultQuality);
         std::printf("%s\n", out.string().c_str());
     }
     return 0;

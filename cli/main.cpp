@@ -121,11 +121,16 @@ int main(int argc, char** argv) {
     CLI::App* gallery = app.add_subcommand(
         "gallery", "Draw every border style, flare type and gradient shape on a photo, as labelled contact sheets");
     gallery->add_option("OUTDIR", gallery_args.output_dir,
-                        "folder for borders.png, flares.png and gradients.png (created if missing)")
+                        "folder for the sheets borders, flares and gradients (created if missing)")
         ->required();
     gallery->add_option("--photo", gallery_args.photo,
                         "photo to draw on, .png, .jpg or .jpeg (default: build/photos/coffee.png, the demo's sample, "
                         "when it is there, else a built-in scene)");
+    gallery->add_option("--width", gallery_args.width, "scale each sheet down to this many pixels wide")
+        ->check(CLI::Range(64u, 100000u));
+    gallery->add_option("--format", gallery_args.format, "file format of the sheets, png or jpg")
+        ->check(CLI::IsMember({"png", "jpg"}))
+        ->capture_default_str();
     gallery->footer("Each tile is the photo scaled to 320 pixels wide with the effect drawn at that size, "
                     "labelled with the value and keyword a document or caller uses.");
 

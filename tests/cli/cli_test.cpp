@@ -347,6 +347,8 @@ TEST_F(Vorlite, UsageErrorsExitWith2OnOneLine) {
         "info --verbose",
         "gallery",
         "gallery " + file("sheets").string() + " --photo " + file("photo.gif").string(),
+        "gallery " + file("sheets").string() + " --format gif",
+        "gallery " + file("sheets").string() + " --width 10",
     };
     for (const std::string& arguments : cases) {
         const Outcome outcome = run(arguments);
@@ -436,6 +438,14 @@ TEST_F(Vorlite, GalleryDrawsEveryFamilyAsALabelledSheet) {
             }
             EXPECT_GT(ink, 20u) << family.sheet << ", label of tile " << i;
         }
+    }
+
+    // Scaled down and as JPEG, for pages that show them.
+    const Outcome small = run("gallery " + file("small").string() + " --photo " + file("photo.png").string() +
+                              " --width 160 --format jpg");
+    ASSERT_EQ(small.status, 0) << small.err;
+    for (const char* name : {"borders.jpg", "flares.jpg", "gradients.jpg"}) {
+        EXPECT_EQ(vorlite::cli::read_image(file("small") / name).width, 160u) << name;
     }
 
     EXPECT_EQ(run("gallery " + file("sheets").string() + " --photo " + file("missing.png").string()).status, 1);
