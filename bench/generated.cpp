@@ -135,19 +135,21 @@ void add_flare(int32_t type, const std::string& operation, float size, const Bit
     const FlareBox box = documented_box(type);
     const double box_pixels = covered(box.x, size, 0.0f, bitmap_size.width) *
                               covered(box.y, size, 0.0f, bitmap_size.height);
-    auto* registered = add_benchmark(
-        operation, kOurs, bitmap_size, label, [type, size, bitmap_size, box_pixels](benchmark::State& state) {
+    // The type without light returns at once: left to find its own count,
+    // the benchmark would copy the photo (untimed) for tens of thousands of
+    // iterations to fill its minimum time.
+    const std::int64_t iterations = type == VOR_FLARE_NONE ? 100 : 0;
+    add_benchmark(
+        operation, kOurs, bitmap_size, label,
+        [type, size, bitmap_size, box_pixels](benchmark::State& state) {
             const VorColor warm{255, 222, 170, 235};
             time_in_place(state, sample(bitmap_size), [&](cv::Mat& image) {
                 VorBitmap bitmap = as_bitmap(image);
                 VorFlare(&bitmap, 1.0f, &warm, type, 0.0f, 0.0f, size, size, VOR_BLEND_SCREEN);
             });
             state.counters[kBoxPixelsCounter] = box_pixels;
-        });
-    // The type without light returns at once: left to find its own count,
-    // the benchmark would copy the photo (untimed) for tens of thousands of
-    // iterations to fill its minimum time.
-    if (type == VOR_FLARE_NONE) registered->Iterations(100);
+        },
+        iterations);
 }
 
 }  // namespace

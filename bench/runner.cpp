@@ -10,9 +10,9 @@ std::string benchmark_name(const std::string& operation, const std::string& side
     return operation + "/" + side + "/" + size.label;
 }
 
-benchmark::internal::Benchmark* add_benchmark(const std::string& operation, const std::string& side,
-                                              const BitmapSize& size, const std::string& label,
-                                              std::function<void(benchmark::State&)> body) {
+void add_benchmark(const std::string& operation, const std::string& side, const BitmapSize& size,
+                   const std::string& label, std::function<void(benchmark::State&)> body,
+                   std::int64_t iterations) {
     const double pixels = static_cast<double>(size.width) * size.height;
     auto* registered = benchmark::RegisterBenchmark(
         benchmark_name(operation, side, size).c_str(),
@@ -26,8 +26,12 @@ benchmark::internal::Benchmark* add_benchmark(const std::string& operation, cons
     // share the machine; wall-clock time is what a caller waits for when a
     // peer uses every core. A 12-megapixel call takes tens to hundreds of
     // milliseconds, so a few iterations per repetition are enough.
-    return registered->MeasureProcessCPUTime()->UseRealTime()->Unit(benchmark::kMillisecond)->MinTime(
-        size.width == kLarge.width ? 0.3 : 0.2);
+    registered->MeasureProcessCPUTime()->UseRealTime()->Unit(benchmark::kMillisecond);
+    if (iterations > 0) {
+        registered->Iterations(iterations);
+    } else {
+        registered->MinTime(size.width == kLarge.width ? 0.3 : 0.2);
+    }
 }
 
 namespace {

@@ -3,6 +3,7 @@
 #define VORLITE_BENCH_RUNNER_H
 
 #include <benchmark/benchmark.h>
+#include <cstdint>
 #include <functional>
 #include <opencv2/core.hpp>
 #include <string>
@@ -18,11 +19,11 @@ std::string benchmark_name(const std::string& operation, const std::string& side
 // Registers body under benchmark_name(...), timed in milliseconds of
 // process CPU time and of wall-clock time, labelled for the report and with
 // the bitmap's pixel count as the counter "pixels".
-// Returns the registered benchmark, for callers that need to bound its
-// iterations.
-benchmark::internal::Benchmark* add_benchmark(const std::string& operation, const std::string& side,
-                                              const BitmapSize& size, const std::string& label,
-                                              std::function<void(benchmark::State&)> body);
+// iterations > 0 fixes the count, for an operation so quick that filling
+// the minimum time would mostly spend its untimed set-up.
+void add_benchmark(const std::string& operation, const std::string& side, const BitmapSize& size,
+                   const std::string& label, std::function<void(benchmark::State&)> body,
+                   std::int64_t iterations = 0);
 
 // Each timing loop first makes one untimed call, so that one-off costs (a
 // peer's tables built on first use, output pages touched the first time) do
