@@ -69,6 +69,16 @@ inline std::int64_t vignette_offset(std::uint32_t size, double fraction) {
     return static_cast<std::int64_t>(offset);
 }
 
+// The vignette (VorVignette) with its rows classified four pixels at a time
+// where the lanes allow (lanes = true), or one by one: the reference the
+// lanes are held against.
+void draw_vignette(VorBitmap* bitmap, const VorBorderParams* params, bool lanes);
+
+// VorGradientApply with each row's table indices formed four pixels at a
+// time where the lanes allow (lanes = true), or one by one: the reference.
+void apply_gradient(VorBitmap* bitmap, const VorGradientShapeParams* params, const VorGradient* gradient,
+                    std::uint32_t blend_mode, double opacity, bool lanes);
+
 // The vignette measured with x and y normalised by the bitmap's width and
 // height, so that the ramp is an ellipse of the bitmap's proportions.
 class StretchedVignette {

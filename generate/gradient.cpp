@@ -9,6 +9,7 @@
 
 #include "color/color_internal.h"
 #include "core/core_internal.h"
+#include "core/simd.h"
 #include "generate/generate_internal.h"
 #include "proclist/proclist_internal.h"
 
@@ -186,6 +187,38 @@ public:
     double at(std::uint32_t x, double row) const {
         return radial_ ? std::sqrt(row + columns_[x]) : columns_[x] - row;
     }
+    // The table index of every pixel of a row, four at a time where the
+    // lanes allow (the same double and float operations lane by lane).
+    void row_indices(std::uint32_t y, std::uint32_t width, std::uint16_t* out, bool lanes) const {
+        const double v = row(y);
+        std::uint32_t x = 0;
+#if VORLITE_EXACT_FLOAT_LANES
+        namespace simd = vorlite::core::simd;
+        using f64x4 = simd::f64x4;
+        if (lanes) {
+            const f64x4 row_lanes = {v, v, v, v};
+            for (; x + 4 <= width; x += 4) {
+                f64x4 column;
+                std::memcpy(&column, &columns_[x], sizeof column);
+                f64x4 coordinate;
+                if (radial_) {
+                    coordinate = row_lanes + column;
+                    for (int i = 0; i < 4; ++i) coordinate[i] = std::sqrt(coordinate[i]);
+                } else {
+                    coordinate = column - row_lanes;
+                }
+                simd::f32x4 g = __builtin_convertvector(coordinate, simd::f32x4);
+                g = simd::min_or_bound(simd::max_or_bound(g, simd::splat(0.0f)), simd::splat(1.0f));
+                const f64x4 scaled = __builtin_convertvector(g * simd::splat(1023.0f), f64x4) + 0.5;
+                const simd::i32x4 index = __builtin_convertvector(scaled, simd::i32x4);
+                for (int i = 0; i < 4; ++i) out[x + i] = static_cast<std::uint16_t>(index[i]);
+            }
+        }
+#else
+        (void)lanes;
+#endif
+        for (; x < width; ++x) out[x] = static_cast<std::uint16_t>(table_index(at(x, v)));
+    }
 
 private:
     bool radial_ = false;
@@ -203,25 +236,26 @@ void blend_pixel(std::uint8_t* p, const VorColor& entry, std::uint32_t mode, flo
     vorlite::core::store_pixel(p, out);
 }
 
-void draw_plain(VorBitmap* bitmap, const VorGradientShapeParams&, const Coordinates& c,
-                const VorColor* table, std::uint32_t mode, double opacity) {
+void draw_plain(VorBitmap* bitmap, const Coordinates& c, const VorColor* table, std::uint32_t mode,
+                double opacity, bool lanes) {
     EntryRows rows(table, mode, opacity);
     const bool by_rows = mode != VOR_BLEND_COLOR && rows.build();
-    std::uint8_t* p = bitmap->data;
-    for (std::uint32_t y = 0; y < bitmap->height; ++y) {
-        const double v = c.row(y);
-        for (std::uint32_t x = 0; x < bitmap->width; ++x, p += 4) {
-            const std::uint32_t index = table_index(c.at(x, v));
-            const VorColor& entry = table[index];
+    const std::uint32_t width = bitmap->width;
+    WorkingArray<std::uint16_t> indices;
+    if (!indices.build(width)) return;
+    std::uint8_t* row = bitmap->data;
+    for (std::uint32_t y = 0; y < bitmap->height; ++y, row += std::size_t{width} * 4) {
+        c.row_indices(y, width, indices.get(), lanes);
+        const std::uint16_t* index = indices.get();
+        vorlite::core::for_each_pixel(row, width, [&](std::uint8_t* p) {
+            const std::uint16_t i = *index++;
             if (by_rows) {
-                const std::uint8_t* r = rows.rows(index);
-                p[0] = r[p[0]];
-                p[1] = r[256 + p[1]];
-                p[2] = r[512 + p[2]];
+                vorlite::core::map_pixel(p, reinterpret_cast<const std::uint8_t(*)[256]>(rows.rows(i)));
             } else {
+                const VorColor& entry = table[i];
                 blend_pixel(p, entry, mode, entry_opacity(opacity, entry));
             }
-        }
+        });
     }
 }
 
@@ -244,13 +278,13 @@ void draw_vignetted(VorBitmap* bitmap, const VorGradientShapeParams& params, con
 }
 
 void draw(VorBitmap* bitmap, const VorGradientShapeParams& params, const VorColor* table,
-          std::uint32_t mode, double opacity) {
+          std::uint32_t mode, double opacity, bool lanes) {
     Coordinates c;
     if (!c.build(params, bitmap->width, bitmap->height)) return;
     if (params.shape == VOR_GRADIENT_LINEAR_VIGNETTE) {
         draw_vignetted(bitmap, params, c, table, mode, opacity);
     } else {
-        draw_plain(bitmap, params, c, table, mode, opacity);
+        draw_plain(bitmap, c, table, mode, opacity, lanes);
     }
 }
 
@@ -289,6 +323,20 @@ struct OwnedGradient {
 };
 
 }  // namespace
+
+namespace vorlite::generate {
+
+void apply_gradient(VorBitmap* bitmap, const VorGradientShapeParams* params, const VorGradient* gradient,
+                    std::uint32_t blend_mode, double opacity, bool lanes) {
+    if (params->scale == 0.0 || !drawable(*gradient)) return;
+    if (bitmap->width == 0 || bitmap->height == 0) return;
+    WorkingArray<VorColor> table;
+    if (!table.build(k_table_size)) return;
+    VorGradientMemoize(gradient, table.get(), k_table_size);
+    draw(bitmap, *params, table.get(), blend_mode, opacity, lanes);
+}
+
+}  // namespace vorlite::generate
 
 extern "C" {
 
@@ -341,12 +389,7 @@ VOR_API void VorGradientMemoize(const VorGradient* gradient, VorColor* table, ui
 
 VOR_API void VorGradientApply(VorBitmap* bitmap, const VorGradientShapeParams* params,
                               const VorGradient* gradient, uint32_t blendMode, double opacity) {
-    if (params->scale == 0.0 || !drawable(*gradient)) return;
-    if (bitmap->width == 0 || bitmap->height == 0) return;
-    WorkingArray<VorColor> table;
-    if (!table.build(k_table_size)) return;
-    VorGradientMemoize(gradient, table.get(), k_table_size);
-    draw(bitmap, *params, table.get(), blendMode, opacity);
+    vorlite::generate::apply_gradient(bitmap, params, gradient, blendMode, opacity, true);
 }
 
 VOR_API int VLPLGradientfromColorsValAndOpacitiesVal(const yajl_val colors, const yajl_val opacities,

@@ -2,6 +2,7 @@
 // smooth ramp from a clear centre to full strength beyond the radius; and
 // the "vignette" processor.
 #include "core/core_internal.h"
+#include "core/simd.h"
 #include "generate/generate_internal.h"
 #include "proclist/proclist_internal.h"
 
@@ -35,6 +36,65 @@ float shaped(float t) {
     return vorlite::generate::shape_vignette(t, Mode);
 }
 
+// What the vignette does at a pixel: a ramp level 0..255, the full colour,
+// or nothing (the clear centre).
+constexpr std::uint16_t k_code_full = 256;
+constexpr std::uint16_t k_code_clear = 257;
+
+template <std::int32_t Mode>
+std::uint16_t code_of(float distance, std::uint8_t alpha) {
+    const float t = shaped<Mode>(distance);
+    if (!(t >= k_vignette_start)) return k_code_clear;
+    if (t > k_vignette_full) return k_code_full;
+    return static_cast<std::uint16_t>(ramp_level(t, alpha));
+}
+
+#if VORLITE_EXACT_FLOAT_LANES
+namespace simd = vorlite::core::simd;
+
+template <std::int32_t Mode>
+simd::f32x4 shaped_lanes(simd::f32x4 t) {
+    if constexpr (Mode == VOR_SHAPE_SHARP) {
+        return t * t;
+    } else if constexpr (Mode == VOR_SHAPE_ULTRA_SHARP) {
+        const simd::f32x4 square = t * t;
+        return square * square;
+    } else if constexpr (Mode == VOR_SHAPE_MEDIUM_SHARP) {
+        for (int i = 0; i < 4; ++i) t[i] = shaped<Mode>(t[i]);
+        return t;
+    } else {
+        return t;
+    }
+}
+
+// code_of on four pixels at once: the same float operations lane by lane.
+// The ramp's product is clamped to 0..255 before truncating, which is the
+// scalar's truncate-then-clamp for every finite value (NaN cannot reach
+// the ramp: it fails the first test).
+template <std::int32_t Mode>
+void codes_of_lanes(simd::f32x4 distance, std::uint8_t alpha, std::uint16_t* out) {
+    const simd::f32x4 t = shaped_lanes<Mode>(distance);
+    const simd::f32x4 u = t * t;
+    const simd::f32x4 u2 = u * u;
+    const simd::f32x4 u3 = u2 * u;
+    const simd::f32x4 u4 = u3 * u;
+    const simd::f32x4 u5 = u4 * u;
+    using vorlite::core::float_bits;
+    const simd::f32x4 p = (((simd::splat(float_bits(0x3FD55555u)) * u2 - simd::splat(2.0f) * u) +
+                            simd::splat(float_bits(0x3E534D35u)) * u4) -
+                           simd::splat(float_bits(0x3F416C17u)) * u3) -
+                          simd::splat(float_bits(0x3D148670u)) * u5;
+    simd::f32x4 level = -p * simd::splat(static_cast<float>(alpha));
+    level = simd::min_or_bound(simd::max_or_bound(level, simd::splat(0.0f)), simd::splat(255.0f));
+    simd::i32x4 code = __builtin_convertvector(level, simd::i32x4);
+    const simd::i32x4 full = t > simd::splat(k_vignette_full);
+    const simd::i32x4 started = t >= simd::splat(k_vignette_start);
+    code = full ? simd::i32x4{k_code_full, k_code_full, k_code_full, k_code_full} : code;
+    code = started ? code : simd::i32x4{k_code_clear, k_code_clear, k_code_clear, k_code_clear};
+    for (int i = 0; i < 4; ++i) out[i] = static_cast<std::uint16_t>(code[i]);
+}
+#endif
+
 struct Vignette {
     VorBitmap* bitmap;
     VorColorBlendMemoTable* memo;
@@ -48,68 +108,109 @@ struct Vignette {
 
     // Squared distance from the centre on the vignette's scale: in pixels,
     // or with x and y normalised by the width and height (an ellipse of the
-    // picture's proportions); the row's share is formed once a row.
+    // picture's proportions). The column's share is formed once per column
+    // and the row's once a row; a pixel adds them in the same order.
     template <bool Stretch, std::int32_t Mode>
-    void draw() const {
+    void row_codes(std::uint32_t y, const float* column_share, const std::int64_t* column_square,
+                   std::uint16_t* codes, bool lanes) const {
+        const std::uint32_t width = bitmap->width;
+        const std::int64_t ey = static_cast<std::int64_t>(y) - cy;
+        const std::int64_t ey2 = ey * ey;
+        const float row_share = static_cast<float>(ey2) * ih;
+        std::uint32_t x = 0;
+#if VORLITE_EXACT_FLOAT_LANES
+        // Without the stretch the pixel's squared distance is converted as a
+        // whole: 32-bit lanes hold it exactly while it stays below 2^31.
+        if (lanes && (Stretch || column_square[width] + ey2 < (std::int64_t{1} << 31))) {
+            for (; x + 4 <= width; x += 4) {
+                simd::f32x4 distance;
+                if constexpr (Stretch) {
+                    distance = (simd::load<simd::f32x4>(column_share + x) + simd::splat(row_share)) * simd::splat(k);
+                } else {
+                    const auto e = static_cast<std::int32_t>(ey2);
+                    const simd::i32x4 sum = simd::i32x4{static_cast<std::int32_t>(column_square[x]),
+                                                        static_cast<std::int32_t>(column_square[x + 1]),
+                                                        static_cast<std::int32_t>(column_square[x + 2]),
+                                                        static_cast<std::int32_t>(column_square[x + 3])} +
+                                            simd::i32x4{e, e, e, e};
+                    distance = __builtin_convertvector(sum, simd::f32x4) * simd::splat(k);
+                }
+                codes_of_lanes<Mode>(distance, colour.a, codes + x);
+            }
+        }
+#else
+        (void)lanes;
+#endif
+        for (; x < width; ++x) {
+            const float distance = Stretch ? (column_share[x] + row_share) * k
+                                           : static_cast<float>(column_square[x] + ey2) * k;
+            codes[x] = code_of<Mode>(distance, colour.a);
+        }
+    }
+
+    template <bool Stretch, std::int32_t Mode>
+    void draw(bool lanes) const {
         const std::uint32_t width = bitmap->width;
         const std::uint32_t height = bitmap->height;
+        // Per column: ex^2 (and after the last column, the largest of them)
+        // and its stretched share; per row: what each pixel takes.
+        vorlite::core::WorkingArray<std::int64_t> column_square;
+        vorlite::core::WorkingArray<float> column_share;
+        vorlite::core::WorkingArray<std::uint16_t> codes;
+        if (!column_square.build(width + 1) || !column_share.build(width) || !codes.build(width)) return;
+        std::int64_t largest = 0;
+        for (std::uint32_t x = 0; x < width; ++x) {
+            const std::int64_t ex = static_cast<std::int64_t>(x) - cx;
+            column_square[x] = ex * ex;
+            column_share[x] = static_cast<float>(column_square[x]) * iw;
+            if (column_square[x] > largest) largest = column_square[x];
+        }
+        column_square[width] = largest;
         const float full_opacity = static_cast<float>(colour.a) * vorlite::core::k_inv255;
         // The memo's level colour.a is that very opacity, and every mode but
         // the colour mode blends channel by channel, so the memo gives the
         // direct blend's bytes beyond the radius too.
         const bool memo_at_full = mode != VOR_BLEND_COLOR;
         const LevelMaps full = level_maps(memo, colour, colour.a);
-        // Neighbouring pixels mostly share a level: the last one's maps are
-        // kept at hand.
-        std::uint32_t last_level = colour.a;
-        LevelMaps last_maps = full;
-        std::uint8_t* p = bitmap->data;
-        for (std::uint32_t y = 0; y < height; ++y) {
-            const std::int64_t ey = static_cast<std::int64_t>(y) - cy;
-            const std::int64_t ey2 = ey * ey;
-            const float row_share = static_cast<float>(ey2) * ih;
-            for (std::uint32_t x = 0; x < width; ++x, p += 4) {
-                const std::int64_t ex = static_cast<std::int64_t>(x) - cx;
-                const std::int64_t ex2 = ex * ex;
-                const float distance =
-                    Stretch ? (static_cast<float>(ex2) * iw + row_share) * k : static_cast<float>(ex2 + ey2) * k;
-                const float t = shaped<Mode>(distance);
-                if (!(t >= k_vignette_start)) continue;
-                LevelMaps maps = full;
-                if (!(t > k_vignette_full)) {
-                    const std::uint32_t level = ramp_level(t, colour.a);
-                    if (level != last_level) {
-                        last_level = level;
-                        last_maps = level_maps(memo, colour, level);
-                    }
-                    maps = last_maps;
-                } else if (!memo_at_full) {
+        std::uint8_t* row = bitmap->data;
+        for (std::uint32_t y = 0; y < height; ++y, row += std::size_t{width} * 4) {
+            row_codes<Stretch, Mode>(y, column_share.get(), column_square.get(), codes.get(), lanes);
+            const std::uint16_t* code = codes.get();
+            vorlite::core::for_each_pixel(row, width, [&](std::uint8_t* p) {
+                const std::uint16_t c = *code++;
+                // Levels change every few pixels along the ramp: each is
+                // looked up afresh (its memo check is all but always taken
+                // the same way) rather than compared with the last one.
+                if (c < k_code_full) {
+                    vorlite::core::map_pixel(p, level_maps(memo, colour, c));
+                    return;
+                }
+                if (c == k_code_clear) return;
+                if (!memo_at_full) {
                     VorColor out = vorlite::core::load_pixel(p);
                     VorColorBlend(&out, &colour, mode, full_opacity);
                     vorlite::core::store_pixel(p, out);
-                    continue;
+                    return;
                 }
-                p[0] = maps[0][p[0]];
-                p[1] = maps[1][p[1]];
-                p[2] = maps[2][p[2]];
-            }
+                vorlite::core::map_pixel(p, full);
+            });
         }
     }
 
     template <bool Stretch>
-    void draw_shaped(std::int32_t shape_mode) const {
+    void draw_shaped(std::int32_t shape_mode, bool lanes) const {
         switch (shape_mode) {
             case VOR_SHAPE_SHARP:
-                draw<Stretch, VOR_SHAPE_SHARP>();
+                draw<Stretch, VOR_SHAPE_SHARP>(lanes);
                 return;
             case VOR_SHAPE_MEDIUM_SHARP:
-                draw<Stretch, VOR_SHAPE_MEDIUM_SHARP>();
+                draw<Stretch, VOR_SHAPE_MEDIUM_SHARP>(lanes);
                 return;
             case VOR_SHAPE_ULTRA_SHARP:
-                draw<Stretch, VOR_SHAPE_ULTRA_SHARP>();
+                draw<Stretch, VOR_SHAPE_ULTRA_SHARP>(lanes);
                 return;
             default:
-                draw<Stretch, VOR_SHAPE_NORMAL>();
+                draw<Stretch, VOR_SHAPE_NORMAL>(lanes);
                 return;
         }
     }
@@ -117,9 +218,9 @@ struct Vignette {
 
 }  // namespace
 
-extern "C" {
+namespace vorlite::generate {
 
-VOR_API void VorVignette(VorBitmap* bitmap, const VorBorderParams* params) {
+void draw_vignette(VorBitmap* bitmap, const VorBorderParams* params, bool lanes) {
     const std::uint32_t width = bitmap->width;
     const std::uint32_t height = bitmap->height;
     if (width == 0 || height < 1) return;
@@ -133,16 +234,25 @@ VOR_API void VorVignette(VorBitmap* bitmap, const VorBorderParams* params) {
                             memo.get(),
                             params->color,
                             mode,
-                            vorlite::generate::vignette_scale(params->vignetteScale),
+                            vignette_scale(params->vignetteScale),
                             1.0f / (w * w),
                             1.0f / (h * h),
-                            static_cast<std::int64_t>(width / 2) + vorlite::generate::vignette_offset(width, params->dx),
-                            static_cast<std::int64_t>(height / 2) + vorlite::generate::vignette_offset(height, params->dy)};
+                            static_cast<std::int64_t>(width / 2) + vignette_offset(width, params->dx),
+                            static_cast<std::int64_t>(height / 2) + vignette_offset(height, params->dy)};
     if (params->stretch != 0) {
-        vignette.draw_shaped<true>(params->shapeMode);
+        vignette.draw_shaped<true>(params->shapeMode, lanes);
     } else {
-        vignette.draw_shaped<false>(params->shapeMode);
+        vignette.draw_shaped<false>(params->shapeMode, lanes);
     }
+}
+
+}  // namespace vorlite::generate
+
+
+extern "C" {
+
+VOR_API void VorVignette(VorBitmap* bitmap, const VorBorderParams* params) {
+    vorlite::generate::draw_vignette(bitmap, params, true);
 }
 
 // "vignette": "color" (colour), "shape" (the vignette's shape object),

@@ -7,6 +7,7 @@
 #include <string>
 #include <vector>
 
+#include "generate/generate_internal.h"
 #include "tests/test_support.h"
 #include "zentra_vorlite.h"
 
@@ -185,3 +186,41 @@ TEST(VignetteProcessor, DrawsOrRefusesWithoutTouching) {
 }
 
 }  // namespace
+
+// Rows classified four pixels at a time store what the pixel-by-pixel
+// reference stores: every shape mode, stretched or not, centres moved off
+// the picture, a radius that puts most pixels on the ramp or beyond it,
+// and the colour mode's direct blend beyond the ramp.
+TEST(Vignette, LanesStoreTheReferenceBytes) {
+    struct Case {
+        int32_t shape_mode;
+        uint8_t stretch;
+        double radius, dx, dy;
+        int32_t mode;
+    };
+    const Case cases[] = {
+        {VOR_SHAPE_NORMAL, 1, 0.6, 0.0, 0.0, VOR_BLEND_MULTIPLY},
+        {VOR_SHAPE_SHARP, 0, 21.0, 0.3, -0.2, VOR_BLEND_NORMAL},
+        {VOR_SHAPE_MEDIUM_SHARP, 1, 0.45, -1.5, 0.7, VOR_BLEND_OVERLAY},
+        {VOR_SHAPE_ULTRA_SHARP, 0, 33.0, 4.0, 0.0, VOR_BLEND_SCREEN},
+        {VOR_SHAPE_NORMAL, 0, 9.0, 0.0, 0.1, VOR_BLEND_COLOR},
+        {VOR_SHAPE_MEDIUM_SHARP, 0, 1e5, 3e9, -3e9, VOR_BLEND_NORMAL},
+    };
+    for (const Case& c : cases) {
+        VorBorderParams p;
+        VorBorderInitParams(&p);
+        p.style = VOR_BORDER_VIGNETTE;
+        p.color = VorColor{30, 60, 200, 210};
+        p.blendMode = c.mode;
+        p.vignetteScale = c.radius;
+        p.stretch = c.stretch;
+        p.shapeMode = c.shape_mode;
+        p.dx = c.dx;
+        p.dy = c.dy;
+        TestBitmap lanes(61, 37), reference(61, 37);
+        vorlite::generate::draw_vignette(lanes.get(), &p, true);
+        vorlite::generate::draw_vignette(reference.get(), &p, false);
+        EXPECT_TRUE(lanes == reference) << c.shape_mode << " " << c.radius;
+        EXPECT_FALSE(lanes.unchanged()) << c.shape_mode << " " << c.radius;
+    }
+}

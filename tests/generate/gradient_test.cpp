@@ -3,6 +3,7 @@
 #include <string>
 #include <vector>
 
+#include "generate/generate_internal.h"
 #include "tests/test_support.h"
 #include "zentra_vorlite.h"
 
@@ -215,3 +216,36 @@ TEST(GradientProcessor, SurvivesDegenerateNumbers) {
 }
 
 }  // namespace
+
+// The row indices formed four at a time store what the pixel-by-pixel
+// reference stores, for every shape, angles that make the coordinate fall
+// and rise, centres and scales that clamp, and the colour mode's own path.
+TEST(GradientApply, LanesStoreTheReferenceBytes) {
+    struct Case {
+        int32_t shape;
+        double scale, x, y, angle;
+        uint32_t mode;
+    };
+    const Case cases[] = {
+        {VOR_GRADIENT_LINEAR, 1.0, 0.0, 0.0, 0.5, VOR_BLEND_OVERLAY},
+        {VOR_GRADIENT_LINEAR, -0.7, 0.3, 0.9, 2.9, VOR_BLEND_MULTIPLY},
+        {VOR_GRADIENT_LINEAR, 0.01, 0.5, 0.5, -1.2, VOR_BLEND_COLOR},
+        {VOR_GRADIENT_RADIAL, 0.6, 0.4, 0.6, 0.0, VOR_BLEND_SCREEN},
+        {VOR_GRADIENT_RADIAL, 3e5, -2.0, 7.0, 0.0, VOR_BLEND_NORMAL},
+    };
+    Gradient g({{20, 0.0}, {240, 40.0}, {90, 100.0}}, {{1.0, 0.0}, {0.3, 60.0}, {0.8, 100.0}});
+    for (const Case& c : cases) {
+        VorGradientShapeParams p;
+        VorGradientShapeParamsInit(&p);
+        p.shape = c.shape;
+        p.scale = c.scale;
+        p.xCenter = c.x;
+        p.yCenter = c.y;
+        p.angle = c.angle;
+        TestBitmap lanes(67, 23, 5), reference(67, 23, 5);
+        vorlite::generate::apply_gradient(&lanes.bitmap, &p, &g.g, c.mode, 0.9, true);
+        vorlite::generate::apply_gradient(&reference.bitmap, &p, &g.g, c.mode, 0.9, false);
+        EXPECT_EQ(lanes.bytes, reference.bytes) << c.shape << " " << c.angle;
+        EXPECT_NE(lanes.bytes, lanes.before) << c.shape << " " << c.angle;
+    }
+}
