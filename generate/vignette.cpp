@@ -170,30 +170,48 @@ struct Vignette {
         // The memo's level colour.a is that very opacity, and every mode but
         // the colour mode blends channel by channel, so the memo gives the
         // direct blend's bytes beyond the radius too.
-        const bool memo_at_full = mode != VOR_BLEND_COLOR;
-        const LevelMaps full = level_maps(memo, colour, colour.a);
-        std::uint8_t* row = bitmap->data;
-        for (std::uint32_t y = 0; y < height; ++y, row += std::size_t{width} * 4) {
-            row_codes<Stretch, Mode>(y, column_share.get(), column_square.get(), codes.get(), lanes);
+        const std::uint16_t full_code =
+            mode != VOR_BLEND_COLOR ? static_cast<std::uint16_t>(colour.a) : k_code_full;
+        const auto draw_row = [&](std::uint8_t* row) {
             const std::uint16_t* code = codes.get();
             vorlite::core::for_each_pixel(row, width, [&](std::uint8_t* p) {
                 const std::uint16_t c = *code++;
-                // Levels change every few pixels along the ramp: each is
-                // looked up afresh (its memo check is all but always taken
-                // the same way) rather than compared with the last one.
                 if (c < k_code_full) {
-                    vorlite::core::map_pixel(p, level_maps(memo, colour, c));
-                    return;
-                }
-                if (c == k_code_clear) return;
-                if (!memo_at_full) {
+                    vorlite::core::map_pixel(p, memo->maps[c]);
+                } else if (c == k_code_full) {
                     VorColor out = vorlite::core::load_pixel(p);
                     VorColorBlend(&out, &colour, mode, full_opacity);
                     vorlite::core::store_pixel(p, out);
-                    return;
                 }
-                vorlite::core::map_pixel(p, full);
             });
+        };
+        // A row and its mirror about the centre lie at the same distances,
+        // so one classification serves both.
+        const std::size_t stride = std::size_t{width} * 4;
+        for (std::uint32_t y = 0; y < height; ++y) {
+            const std::int64_t ey = static_cast<std::int64_t>(y) - cy;
+            const std::int64_t mirror = cy - ey;
+            if (ey > 0 && mirror >= 0) continue;
+            row_codes<Stretch, Mode>(y, column_share.get(), column_square.get(), codes.get(), lanes);
+            settle_levels(codes.get(), width, full_code);
+            draw_row(bitmap->data + y * stride);
+            if (ey < 0 && mirror < static_cast<std::int64_t>(height)) {
+                draw_row(bitmap->data + static_cast<std::size_t>(mirror) * stride);
+            }
+        }
+    }
+
+    // Fills every ramp level a row uses before the row is drawn, so the
+    // pixel loop reads the memo's maps without asking; beyond the radius
+    // the memo's own level stands for the full colour where it may.
+    void settle_levels(std::uint16_t* codes, std::uint32_t width, std::uint16_t full_code) const {
+        std::uint16_t last = k_code_clear;
+        for (std::uint32_t x = 0; x < width; ++x) {
+            std::uint16_t c = codes[x];
+            if (c == k_code_full) c = codes[x] = full_code;
+            if (c == last || c >= k_code_full) continue;
+            level_maps(memo, colour, c);
+            last = c;
         }
     }
 
