@@ -920,6 +920,197 @@ VOR_API void VorRingFlare(VorBitmap* bitmap, float cx, float cy, float radius, c
 VOR_API void VorFlareLegacyCorvale(VorBitmap* bitmap, const VLPLRunOptions* options);
 VOR_API void VorFlareLegacyEmberly(VorBitmap* bitmap, const VLPLRunOptions* options);
 
+/* ====================================================================== */
+/* Masks                                                                  */
+/* ====================================================================== */
+
+/* A mask is a bitmap of the photograph's size whose alpha is the coverage of
+ * a tool: 255 shows the processed image, 0 the untouched photograph. Mask
+ * coordinates are pixels with centres on whole numbers. Sizes are trusted:
+ * the functions taking an image index the mask with the image's size. */
+
+/* Every pixel (255, 255, 255, 255). */
+VOR_API void VorMaskSetOpaque(VorBitmap* mask);
+/* Every pixel (0, 0, 0, 0). */
+VOR_API void VorMaskSetTransparent(VorBitmap* mask);
+/* Colour-aware soft brush: raises (or with erase lowers) the mask's alpha
+ * inside radius * 1.43 of the centre, weighted by distance and, unless
+ * ignoreColor, by a Gaussian of the L*a*b* distance (a*b* only without
+ * useLightness) from the reference colour against tolerance. reserved is
+ * not read. Only alpha is written. */
+VOR_API void VorMaskSimilarColors(const VorBitmap* image, VorBitmap* mask,
+                                  const VorColor* reference, double centerX, double centerY,
+                                  double radius, double tolerance, double reserved,
+                                  double strength, uint8_t erase, uint8_t useLightness,
+                                  uint8_t ignoreColor);
+/* Plain soft brush with a four-pixel soft edge, writing all four bytes:
+ * paints the colour (its alpha unused) as a premultiplied layer, or with
+ * erase fades all four bytes toward 0. Truncates rather than rounds. */
+VOR_API void VorMaskDraw(VorBitmap* mask, const VorColor* paint, double centerX, double centerY,
+                         double radius, double strength, uint8_t erase);
+/* Quantised Gaussian hole: alpha 0 at the centre rising to 255 far away, in
+ * the levels 0, 4, 12, ..., 252, 255. Only alpha is written. */
+VOR_API void VorMaskRadial(const VorBitmap* image, VorBitmap* mask, double centerX,
+                           double centerY, double radius);
+/* Quantised Gaussian band: alpha 0 along the line through the centre at
+ * the angle (radians), stepped in whole pixels of distance. Only alpha is
+ * written. */
+VOR_API void VorMaskLinear(const VorBitmap* image, VorBitmap* mask, double centerX,
+                           double centerY, double width, double angle);
+
+/* ====================================================================== */
+/* Stroke interpolation                                                   */
+/* ====================================================================== */
+
+/* Evenly spaced brush positions along a stroke: half the radius apart, or
+ * sqrt(2 * radius + 1) apart for the paint brush (paintFlag non-zero). Each
+ * writes a malloc'ed array the caller releases with free, and its length.
+ * The points run from next to the start toward the end, which comes last;
+ * the start itself, emitted by the previous call, is not repeated. The
+ * radius must be positive. */
+
+/* The straight leg from a to the midpoint of a and b. */
+VOR_API void VorInterpolateFirstPointToMidpoint(VorPoint a, VorPoint b, float radius,
+                                                VorPoint** outPoints, uint32_t* outCount,
+                                                int32_t paintFlag);
+/* The quadratic curve from the midpoint of a and b to that of b and c, b
+ * its control point. */
+VOR_API void VorInterpolateBetweenPointsWithBezierQuadCurve(VorPoint a, VorPoint b, VorPoint c,
+                                                            float radius, VorPoint** outPoints,
+                                                            uint32_t* outCount, int32_t paintFlag);
+/* The same curve, then the straight leg from the midpoint of b and c back
+ * to b: a finished stroke ends at b, not at c. */
+VOR_API void VorInterpolateBetweenPointsWithBezierQuadCurveAndFinishToPoint(
+    VorPoint a, VorPoint b, VorPoint c, float radius, VorPoint** outPoints, uint32_t* outCount,
+    int32_t paintFlag);
+/* The straight leg from the midpoint of a and b to b. */
+VOR_API void VorInterpolateMidpointToSecondPoint(VorPoint a, VorPoint b, float radius,
+                                                 VorPoint** outPoints, uint32_t* outCount,
+                                                 int32_t paintFlag);
+
+/* ====================================================================== */
+/* Red-eye and whitening                                                  */
+/* ====================================================================== */
+
+/* Where red is at least green + blue in the source, the destination's red
+ * becomes the mean of green and blue rounded half up; nothing else is
+ * written. Nothing unless both bitmaps have the same size. In place when
+ * both are the same bitmap. */
+VOR_API void VorRedEye(VorBitmap* destination, const VorBitmap* source);
+/* Brightens and de-yellows pixels near a fixed tooth-like hue, in place;
+ * second is not read. Alpha kept. */
+VOR_API void VorWhiten(VorBitmap* image, const VorBitmap* second);
+
+/* ====================================================================== */
+/* Tool engine                                                            */
+/* ====================================================================== */
+
+/* A tool use keeps three bitmaps of one size: the photograph, a full copy
+ * with the tool's effect applied everywhere, and a mask whose alpha says
+ * where the full copy shows. Touches edit the mask only; previews mix the
+ * two through it. The records belong to the host; the engine never
+ * allocates or frees them and keeps no state between calls. */
+
+/* Tool kinds: 1 desaturate except where brushed (mask starts opaque),
+ * 2 and 3 blur, 4 red-eye, 5 whitening, 6 darken (colour-aware brush),
+ * 7 to 9 tints, 10 sharpen, 11 soften, 12 colour paint (the mask is the
+ * paint layer). Kinds 2 and 7 to 11 are edited with shapes. */
+typedef struct VorToolDrawParams {
+    int32_t kind;         /* 0: nothing */
+    VorColor color;       /* opaque white; kinds 6 to 9 overwrite it with their tint */
+    double strength;      /* 1.0: brush strength of kinds 3, 4, 5 and 12 */
+    uint8_t skipFullTool; /* 0: when set the full image stays a plain copy */
+    uint8_t redOverlay;   /* 0: when set the full image is solid red */
+} VorToolDrawParams;
+
+typedef struct VorToolDrawState {
+    VorColor color; /* opaque white: paint colour of kind 12, sampled colour of kind 1 mode 3 */
+    uint8_t flag;   /* 0: not read */
+    int32_t kind;   /* not set by VorToolDrawStateInit: the host copies the parameters' kind */
+} VorToolDrawState;
+
+typedef struct VorToolPoint {
+    VorPoint position; /* (0, 0) */
+    double radius;     /* 0.0, pixels */
+    int32_t mode;      /* 0: 1 apply, 2 erase, 3 colour-aware (kind 1) */
+} VorToolPoint;
+
+typedef struct VorToolStroke {
+    VorPoint* points;      /* null: touch positions, owned by the host */
+    uint32_t count;        /* 0: valid points */
+    uint32_t nextIndex;    /* 0: first point not yet drawn, advanced by the host */
+    uint8_t finished;      /* 0: set when the finger lifts */
+    double radius;         /* 0.0: brush radius, pixels of the edited image */
+    int32_t mode;          /* 0: 1 apply, 2 erase, 3 colour-aware (kind 1 only) */
+    uint8_t useFixedColor; /* 0: kind 1 mode 3 takes fixedColor instead of sampling */
+    VorColor fixedColor;   /* opaque white */
+} VorToolStroke;
+
+typedef struct VorToolShape {
+    int32_t kind;     /* 0: 1 radial, 2 linear */
+    VorPoint center;  /* (0, 0) */
+    double size;      /* 0.0: radius of the radial shape, half-width of the band */
+    double angle;     /* 0.0: degrees, linear shape only */
+} VorToolShape;
+
+/* Defaults of the records, as noted on their fields. */
+VOR_API void VorToolDrawParamsInit(VorToolDrawParams* params);
+VOR_API void VorToolDrawStateInit(VorToolDrawState* state);
+VOR_API void VorToolDrawStateDestroy(VorToolDrawState* state); /* nothing to release */
+VOR_API void VorToolPointInit(VorToolPoint* point);
+VOR_API void VorToolStrokeInit(VorToolStroke* stroke);
+VOR_API void VorToolShapeInit(VorToolShape* shape);
+
+/* Copies the image into full (stops if that fails), sets the mask for the
+ * kind, and unless skipFullTool applies the kind's effect to full. The
+ * three bitmaps have one size. */
+VOR_API void VorToolInit(const VorBitmap* image, VorBitmap* full, VorBitmap* mask,
+                         VorToolDrawParams* params, VorToolDrawState* state);
+/* Kind 1: an opaque mask; every other kind: a transparent one. */
+VOR_API void VorToolConfigureMask(const VorBitmap* image, VorBitmap* mask,
+                                  const VorToolDrawParams* params);
+/* Applies the kind's effect to the bitmap in place, or solid red with
+ * redOverlay; kind 12 and unknown kinds do nothing. Kinds 6 to 9 write
+ * their tint into params->color. */
+VOR_API void VorToolApplyFullTool(VorBitmap* image, VorToolDrawParams* params);
+/* Kind 1 in mode 3: the state colour becomes the stroke's fixed colour or
+ * the image's colour under its first point. */
+VOR_API void VorToolFirstDownProcessing(const VorBitmap* image, const VorToolStroke* stroke,
+                                        const VorToolDrawParams* params,
+                                        VorToolDrawState* state);
+/* One brush dab of the kind into the mask. */
+VOR_API void VorToolDrawPoint(const VorBitmap* image, VorBitmap* mask, const VorToolPoint* point,
+                              const VorToolDrawParams* params, const VorToolDrawState* state);
+/* Draws the stroke's points from nextIndex on and reports the rectangle of
+ * the last segment drawn, padded by the brush diameter (left untouched when
+ * only the first point was drawn). */
+VOR_API void VorToolDrawStrokeOutRect(const VorBitmap* image, VorBitmap* mask,
+                                      const VorToolStroke* stroke, const VorToolDrawParams* params,
+                                      VorToolDrawState* state, VorPoint* outMin,
+                                      VorPoint* outMax);
+/* The same without the rectangle. */
+VOR_API void VorToolDrawStroke(const VorBitmap* image, VorBitmap* mask, const VorToolStroke* stroke,
+                               const VorToolDrawParams* params, VorToolDrawState* state);
+/* Fills the mask with the radial or linear shape. */
+VOR_API void VorToolDrawShapeInMask(const VorBitmap* image, VorBitmap* mask,
+                                    const VorToolShape* shape);
+/* Mixes image and full through the mask's alpha m into out over the pixels
+ * x0..x1, y0..y1 (corners in any order, clamped to the bitmap):
+ * ((255 - m) * image + m * full + 127) >> 8 on red, green, blue; out's
+ * alpha is not written. Nothing when out, image and mask differ in size.
+ * reserved is not read. */
+VOR_API void VorToolRenderPreviewBox(VorBitmap* out, const VorBitmap* image, const VorBitmap* full,
+                                     const VorBitmap* mask, int32_t x0, int32_t y0, int32_t x1,
+                                     int32_t y1, const void* reserved);
+/* The same over the whole bitmap. */
+VOR_API void VorToolRenderPreview(VorBitmap* out, const VorBitmap* image, const VorBitmap* full,
+                                  const VorBitmap* mask, const void* reserved);
+/* Applies the finished edit to the image in place through a mask of its
+ * size: the paint layer laid over it for state kind 12, otherwise the
+ * kind's effect recomputed on a copy and blended through the mask. */
+VOR_API void VorToolRenderHiRes(VorBitmap* image, const VorBitmap* mask, VorToolDrawParams* params,
+                                const VorToolDrawState* state);
+
 #ifdef __cplusplus
 }
 #endif
