@@ -14,7 +14,7 @@ namespace {
 // A run longer than this is no stroke a finger can make (it is a radius of
 // a millionth of a pixel or a coordinate of 1e30): it is cut here rather
 // than asking for gigabytes.
-constexpr std::int32_t k_max_points = 1 << 24;
+constexpr std::int32_t k_max_points = 1 << 20;
 
 float spacing(float radius, std::int32_t paint) {
     if (paint != 0) return static_cast<float>(std::sqrt(static_cast<double>((radius + radius) + 1.0f)));
