@@ -60,6 +60,18 @@ struct GalleryArgs {
     std::string format = "png";                  // "png" or "jpg"
 };
 
+// A brush script replayed on a preview and rendered on the photo.
+struct PaintArgs {
+    std::filesystem::path script, input, output;
+    uint32_t preview_width = 1080, preview_height = 1080;
+    std::optional<std::filesystem::path> frames;  // the preview after every gesture
+    bool compare = false;
+    int quality = kDefaultQuality;
+};
+
+// The tool names a paint script may use, comma-separated.
+std::string tool_kind_list();
+
 int run_apply(const ApplyArgs& args);
 int run_check(const std::filesystem::path& effect);
 int run_adjust(const AdjustArgs& args);
@@ -67,5 +79,6 @@ int run_auto(const AutoArgs& args);
 int run_batch(const BatchArgs& args);
 int run_info();
 int run_gallery(const GalleryArgs& args);
+int run_paint(const PaintArgs& args);
 
 }  // namespace vorlite::cli

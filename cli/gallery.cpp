@@ -64,25 +64,7 @@ Image synthetic_scene(uint32_t width, uint32_t height) {
 Image scaled_down(const Image& photo, uint32_t width) {
     if (photo.width <= width) return photo;
     const double step = static_cast<double>(photo.width) / width;
-    const auto height = std::max<uint32_t>(1, static_cast<uint32_t>(photo.height / step));
-    Image scaled(width, height);
-    for (uint32_t y = 0; y < height; ++y) {
-        const auto y0 = static_cast<uint32_t>(y * step);
-        const auto y1 = std::min(photo.height, std::max(y0 + 1, static_cast<uint32_t>((y + 1) * step)));
-        for (uint32_t x = 0; x < width; ++x) {
-            const auto x0 = static_cast<uint32_t>(x * step);
-            const auto x1 = std::min(photo.width, std::max(x0 + 1, static_cast<uint32_t>((x + 1) * step)));
-            uint32_t sum[4] = {0, 0, 0, 0};
-            for (uint32_t sy = y0; sy < y1; ++sy) {
-                for (uint32_t sx = x0; sx < x1; ++sx) {
-                    for (int c = 0; c < 4; ++c) sum[c] += photo.pixel(sx, sy)[c];
-                }
-            }
-            const uint32_t n = (y1 - y0) * (x1 - x0);
-            for (int c = 0; c < 4; ++c) scaled.pixel(x, y)[c] = static_cast<uint8_t>(sum[c] / n);
-        }
-    }
-    return scaled;
+    return reduced(photo, width, std::max<uint32_t>(1, static_cast<uint32_t>(photo.height / step)));
 }
 
 // Dark text from (left, top), cut off at right so that a label never runs

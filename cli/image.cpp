@@ -31,6 +31,79 @@ bool is_opaque(const Image& image) {
     return true;
 }
 
+Image reduced(const Image& image, uint32_t width, uint32_t height) {
+    const double step_x = static_cast<double>(image.width) / width;
+    const double step_y = static_cast<double>(image.height) / height;
+    Image out(width, height);
+    for (uint32_t y = 0; y < height; ++y) {
+        const auto y0 = static_cast<uint32_t>(y * step_y);
+        const auto y1 = std::min(image.height, std::max(y0 + 1, static_cast<uint32_t>((y + 1) * step_y)));
+        for (uint32_t x = 0; x < width; ++x) {
+            const auto x0 = static_cast<uint32_t>(x * step_x);
+            const auto x1 = std::min(image.width, std::max(x0 + 1, static_cast<uint32_t>((x + 1) * step_x)));
+            uint64_t sum[4] = {0, 0, 0, 0};
+            for (uint32_t sy = y0; sy < y1; ++sy) {
+                const uint8_t* p = image.pixel(x0, sy);
+                for (uint32_t sx = x0; sx < x1; ++sx, p += 4) {
+                    for (int c = 0; c < 4; ++c) sum[c] += p[c];
+                }
+            }
+            const uint64_t n = uint64_t{y1 - y0} * (x1 - x0);
+            for (int c = 0; c < 4; ++c) out.pixel(x, y)[c] = static_cast<uint8_t>((sum[c] + n / 2) / n);
+        }
+    }
+    return out;
+}
+
+namespace {
+
+// Where an output pixel's centre falls among the source's: the lower
+// source index and the weight of the next, in 1/256.
+struct Tap {
+    uint32_t index;
+    uint32_t weight;
+};
+
+std::vector<Tap> taps(uint32_t source, uint32_t target) {
+    std::vector<Tap> out(target);
+    const double scale = static_cast<double>(source) / target;
+    for (uint32_t i = 0; i < target; ++i) {
+        const double at = std::clamp((i + 0.5) * scale - 0.5, 0.0, static_cast<double>(source - 1));
+        const auto index = std::min(static_cast<uint32_t>(at), source - 1);
+        const auto weight = index + 1 < source ? static_cast<uint32_t>((at - index) * 256.0 + 0.5) : 0u;
+        out[i] = Tap{index, std::min(weight, 256u)};
+    }
+    return out;
+}
+
+}  // namespace
+
+Image enlarged(const Image& image, uint32_t width, uint32_t height) {
+    Image out(width, height);
+    if (image.width == 0 || image.height == 0) return out;
+    const std::vector<Tap> columns = taps(image.width, width);
+    const std::vector<Tap> rows = taps(image.height, height);
+    for (uint32_t y = 0; y < height; ++y) {
+        const Tap row = rows[y];
+        const uint32_t below = std::min(row.index + 1, image.height - 1);
+        for (uint32_t x = 0; x < width; ++x) {
+            const Tap column = columns[x];
+            const uint32_t right = std::min(column.index + 1, image.width - 1);
+            const uint8_t* a = image.pixel(column.index, row.index);
+            const uint8_t* b = image.pixel(right, row.index);
+            const uint8_t* c = image.pixel(column.index, below);
+            const uint8_t* d = image.pixel(right, below);
+            uint8_t* o = out.pixel(x, y);
+            for (int k = 0; k < 4; ++k) {
+                const uint32_t top = a[k] * (256 - column.weight) + b[k] * column.weight;
+                const uint32_t bottom = c[k] * (256 - column.weight) + d[k] * column.weight;
+                o[k] = static_cast<uint8_t>((top * (256 - row.weight) + bottom * row.weight + 32768) >> 16);
+            }
+        }
+    }
+    return out;
+}
+
 Image orient_upright(const Image& image, int exif_orientation) {
     if (exif_orientation < 2 || exif_orientation > 8) return image;
     const uint32_t w = image.width;

@@ -59,6 +59,14 @@ Image orient_upright(const Image& image, int exif_orientation);
 // tops aligned.
 Image side_by_side(const Image& left, const Image& right);
 
+// Area-average reduction to width x height, each at most the image's own
+// and at least 1: every source pixel counts toward the one it falls in.
+Image reduced(const Image& image, uint32_t width, uint32_t height);
+// Bilinear enlargement of all four bytes to width x height, each at least
+// the image's own, with pixel centres aligned: a premultiplied layer stays
+// premultiplied.
+Image enlarged(const Image& image, uint32_t width, uint32_t height);
+
 // Reads a PNG or JPEG (by extension) into RGBA; JPEGs are turned upright
 // by their EXIF orientation. Throws Failure with a line naming the file.
 Image read_image(const std::filesystem::path& path);

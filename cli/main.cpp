@@ -51,6 +51,23 @@ void add_run_settings(CLI::App* command, RunSettings& run) {
     command->add_flag("--no-borders", run.no_borders, "leave out the borders an effect would draw");
 }
 
+// "WxH" with both sides 16..20000.
+CLI::Validator preview_size(uint32_t& width, uint32_t& height) {
+    return CLI::Validator(
+        [&width, &height](std::string& input) -> std::string {
+            unsigned w = 0, h = 0;
+            char extra = 0;
+            if (std::sscanf(input.c_str(), "%ux%u%c", &w, &h, &extra) != 2 || w < 16 || h < 16 || w > 20000 ||
+                h > 20000) {
+                return "Value " + input + " is not a size WxH with sides 16 to 20000";
+            }
+            width = w;
+            height = h;
+            return {};
+        },
+        "WxH");
+}
+
 // The one line of a command-line error, with the command it belongs to.
 std::string usage_line(const CLI::App& app, const CLI::ParseError& error) {
     std::string command = "vorlite";
@@ -134,6 +151,25 @@ int main(int argc, char** argv) {
     gallery->footer("Each tile is the photo scaled to 320 pixels wide with the effect drawn at that size, "
                     "labelled with the value and keyword a document or caller uses.");
 
+    PaintArgs paint_args;
+    std::string preview_text;
+    CLI::App* paint = app.add_subcommand(
+        "paint", "Replay a brush script (strokes and shapes of one tool) on a preview, then render it on the photo");
+    paint->add_option("SCRIPT", paint_args.script, "brush script (JSON)")->required();
+    paint->add_option("IN", paint_args.input, "photo to read")->required();
+    paint->add_option("OUT", paint_args.output, "photo to write")->required();
+    paint->add_option("--preview-size", preview_text, "the box the edited preview fits in (default 1080x1080)")
+        ->check(preview_size(paint_args.preview_width, paint_args.preview_height));
+    paint->add_option("--frames", paint_args.frames, "write the preview after every gesture into this folder");
+    paint->add_flag("--compare", paint_args.compare, "write the original and the result side by side");
+    add_quality(paint, paint_args.quality);
+    paint->footer("A script is {\"tool\": NAME, \"strength\": 0..1, \"color\": {\"r\", \"g\", \"b\", \"a\"}, "
+                  "\"gestures\": [...]}; a gesture is {\"type\": \"stroke\", \"points\": [[x, y], ...], \"radius\": R, "
+                  "\"mode\": \"apply\" | \"erase\" | \"color-aware\"}, {\"type\": \"radial\", \"center\": [x, y], "
+                  "\"radius\": R} or {\"type\": \"linear\", \"center\": [x, y], \"width\": W, \"angle\": degrees}, "
+                  "in the photo's pixels. Tools: " +
+                  tool_kind_list() + ".");
+
     CLI::App* info = app.add_subcommand("info", "Show the library and document-format versions and the processors");
 
     try {
@@ -153,6 +189,7 @@ int main(int argc, char** argv) {
         if (*batch) return run_batch(batch_args);
         if (*info) return run_info();
         if (*gallery) return run_gallery(gallery_args);
+        if (*paint) return run_paint(paint_args);
     } catch (const UsageError& error) {
         std::fprintf(stderr, "vorlite: %s\n", error.what());
         return kUsageStatus;

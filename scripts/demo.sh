@@ -1,7 +1,8 @@
 #!/usr/bin/env bash
 # The main job: builds the vorlite tool, runs every bundled look of
 # examples/effects/ on the sample photographs and writes before-and-after
-# comparisons (original left, look right) to out/.
+# comparisons (original left, look right) to out/, then replays every brush
+# script of examples/tools/ on the photo it names.
 set -euo pipefail
 cd "$(dirname "$0")/.."
 "$PWD/scripts/setup.sh" --photos
@@ -19,4 +20,13 @@ for look in examples/effects/*.json; do
     count=$((count + 1))
   done
 done
-echo "demo: $count before-and-after comparisons of $(ls examples/effects/*.json | wc -l) looks in $PWD/out/"
+scripts=0
+for script in examples/tools/*.json; do
+  name=$(basename "$script" .json)
+  # Each brush script names the sample photo it was drawn for.
+  photo=$(sed -n 's|^// photo: ||p' "$script")
+  "$tool" paint "$script" "build/photos/$photo" "out/$(basename "${photo%.*}")-brush-$name.jpg" --compare --quality 88
+  scripts=$((scripts + 1))
+done
+echo "demo: $count before-and-after comparisons of $(ls examples/effects/*.json | wc -l) looks" \
+  "and $scripts brush edits in $PWD/out/"

@@ -6,6 +6,7 @@
 #include <algorithm>
 #include <cstdlib>
 #include <fstream>
+#include <map>
 #include <sstream>
 #include <string>
 #include <vector>
@@ -451,4 +452,114 @@ TEST_F(Vorlite, GalleryDrawsEveryFamilyAsALabelledSheet) {
     EXPECT_EQ(run("gallery " + file("sheets").string() + " --photo " + file("missing.png").string()).status, 1);
     // A file where the folder should be.
     EXPECT_EQ(run("gallery " + file("photo.png").string() + " --photo " + file("photo.png").string()).status, 1);
+}
+
+// ---- paint ---------------------------------------------------------------
+
+TEST(CliScaling, ReductionAveragesAndEnlargementKeepsFlatAreas) {
+    Image checker(4, 2);
+    for (uint32_t i = 0; i < 8; ++i) checker.rgba[4 * i] = (i % 2) != 0 ? 200 : 100;
+    const Image half = vorlite::cli::reduced(checker, 2, 1);
+    EXPECT_EQ(half.rgba[0], 150);
+    EXPECT_EQ(half.rgba[4], 150);
+    Image flat(3, 2);
+    std::fill(flat.rgba.begin(), flat.rgba.end(), uint8_t{77});
+    const Image big = vorlite::cli::enlarged(flat, 31, 17);
+    EXPECT_TRUE(std::all_of(big.rgba.begin(), big.rgba.end(), [](uint8_t b) { return b == 77; }));
+    Image ramp(2, 1);
+    ramp.rgba[0] = 0;
+    ramp.rgba[4] = 255;
+    const Image wide = vorlite::cli::enlarged(ramp, 8, 1);
+    EXPECT_EQ(wide.rgba[0], 0) << "the outer pixels stay the source's";
+    EXPECT_EQ(wide.rgba[28], 255);
+    for (int x = 1; x < 8; ++x) EXPECT_GE(wide.rgba[4 * x], wide.rgba[4 * (x - 1)]);
+}
+
+TEST_F(Vorlite, PaintReplaysEveryExampleScriptReproducibly) {
+    // A stand-in photo large enough for every script's coordinates, edited
+    // on a small preview: each script's output is locked by its checksum.
+    vorlite::cli::write_image(sample(640, 512, true), file("photo.png"), 90);
+    std::map<std::string, uint32_t> sums;
+    for (const auto& entry : fs::directory_iterator(VORLITE_TOOLS_DIR)) {
+        if (entry.path().extension() != ".json") continue;
+        const std::string name = entry.path().stem().string();
+        const Outcome outcome = run("paint " + entry.path().string() + " " + file("photo.png").string() + " " +
+                                    file(name + ".png").string() + " --preview-size 200x200");
+        ASSERT_EQ(outcome.status, 0) << name << ": " << outcome.err;
+        const Image out = vorlite::cli::read_image(file(name + ".png"));
+        ASSERT_EQ(out.width, 640u);
+        uint32_t h = 2166136261u;
+        for (const uint8_t b : out.rgba) h = (h ^ b) * 16777619u;
+        sums[name] = h;
+    }
+    const std::map<std::string, uint32_t> expected = {
+        {"blur", 3404345282u},       {"blur-brush", 3645727101u}, {"darken", 1736301178u},
+        {"desaturate-except", 3330077070u}, {"paint", 1617571091u}, {"red-eye", 1561416138u},
+        {"sharpen", 2349510539u},    {"soften", 1981392263u},     {"tint-amber", 3875781411u},
+        {"tint-rose", 2599914264u},  {"tint-warm", 2485482u},     {"whiten", 2259208467u},
+    };
+    EXPECT_EQ(sums, expected);
+}
+
+TEST_F(Vorlite, PaintWritesAFramePerGestureAtThePreviewSize) {
+    vorlite::cli::write_image(sample(300, 200, true), file("photo.png"), 90);
+    const fs::path script = document("s.json", R"({"tool": "blur-brush", "gestures": [
+        {"type": "stroke", "radius": 12, "points": [[20, 20], [80, 40], [150, 30], [220, 90]]},
+        {"type": "stroke", "radius": 12, "mode": "erase", "points": [[100, 35]]},
+        {"type": "radial", "center": [150, 100], "radius": 40}]})");
+    const Outcome outcome = run("paint " + script.string() + " " + file("photo.png").string() + " " +
+                                file("out.png").string() + " --preview-size 150x150 --frames " + file("frames").string());
+    ASSERT_EQ(outcome.status, 0) << outcome.err;
+    std::vector<std::string> names;
+    for (const auto& entry : fs::directory_iterator(file("frames"))) names.push_back(entry.path().filename().string());
+    std::sort(names.begin(), names.end());
+    EXPECT_EQ(names, (std::vector<std::string>{"frame-001.png", "frame-002.png", "frame-003.png"}));
+    const Image frame = vorlite::cli::read_image(file("frames") / "frame-001.png");
+    EXPECT_EQ(frame.width, 150u);
+    EXPECT_EQ(frame.height, 100u);
+    EXPECT_NE(slurp(file("frames") / "frame-001.png"), slurp(file("frames") / "frame-003.png"));
+}
+
+TEST_F(Vorlite, PaintRefusesEveryBadScriptWithOneLineAndWritesNothing) {
+    vorlite::cli::write_image(sample(100, 80, true), file("photo.png"), 90);
+    const std::string stroke = R"({"type": "stroke", "radius": 5, "points": [[10, 10]]})";
+    const std::pair<const char*, std::string> cases[] = {
+        {"line 1", "{\"tool\": "},
+        {"expected an object", "[1, 2]"},
+        {"unknown tool", R"({"tool": "smudge", "gestures": [)" + stroke + "]}"},
+        {"gestures", R"({"tool": "paint", "gestures": []})"},
+        {"gestures", R"({"tool": "paint"})"},
+        {"unknown key", R"({"tool": "paint", "speed": 2, "gestures": [)" + stroke + "]}"},
+        {"outside", R"({"tool": "paint", "gestures": [{"type": "stroke", "radius": 5, "points": [[10, 10], [100, 5]]}]})"},
+        {"outside", R"({"tool": "paint", "gestures": [{"type": "stroke", "radius": 5, "points": [[-1, 10]]}]})"},
+        {"radius", R"({"tool": "paint", "gestures": [{"type": "stroke", "radius": 0, "points": [[10, 10]]}]})"},
+        {"radius", R"({"tool": "paint", "gestures": [{"type": "stroke", "radius": -3, "points": [[10, 10]]}]})"},
+        {"radius", R"({"tool": "paint", "gestures": [{"type": "stroke", "radius": 1e400, "points": [[10, 10]]}]})"},
+        {"points[0][0]", R"({"tool": "paint", "gestures": [{"type": "stroke", "radius": 5, "points": [["a", 10]]}]})"},
+        {"points", R"({"tool": "paint", "gestures": [{"type": "stroke", "radius": 5, "points": []}]})"},
+        {"unknown mode", R"({"tool": "paint", "gestures": [{"type": "stroke", "radius": 5, "mode": "color-aware", "points": [[1, 1]]}]})"},
+        {"unknown gesture", R"({"tool": "paint", "gestures": [{"type": "spray"}]})"},
+        {"shapes", R"({"tool": "tint-rose", "gestures": [)" + stroke + "]}"},
+        {"strokes", R"({"tool": "paint", "gestures": [{"type": "radial", "center": [5, 5], "radius": 9}]})"},
+        {"angle", R"({"tool": "blur", "gestures": [{"type": "linear", "center": [5, 5], "width": 9, "angle": 1e9}]})"},
+        {"strength", R"({"tool": "paint", "strength": 2, "gestures": [)" + stroke + "]}"},
+        {"color", R"({"tool": "paint", "color": {"r": 300}, "gestures": [)" + stroke + "]}"},
+    };
+    for (const auto& [fragment, text] : cases) {
+        const fs::path script = document("bad.json", text);
+        const Outcome outcome = run("paint " + script.string() + " " + file("photo.png").string() + " " +
+                                    file("out.png").string());
+        EXPECT_EQ(outcome.status, 2) << text;
+        EXPECT_EQ(lines(outcome.err), 1u) << text << "\n" << outcome.err;
+        EXPECT_NE(outcome.err.find(fragment), std::string::npos) << text << "\n" << outcome.err;
+        EXPECT_FALSE(fs::exists(file("out.png"))) << text;
+    }
+    // A stroke of a thousand touches is a defined edit, not an error.
+    std::string many = R"({"tool": "whiten", "gestures": [{"type": "stroke", "radius": 3, "points": [)";
+    for (int i = 0; i < 1000; ++i) many += (i ? ", [" : "[") + std::to_string(i % 97) + ", " + std::to_string(i % 79) + "]";
+    many += "]}]}";
+    EXPECT_EQ(run("paint " + document("many.json", many).string() + " " + file("photo.png").string() + " " +
+                  file("many.png").string())
+                  .status,
+              0);
 }
