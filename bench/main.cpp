@@ -106,6 +106,7 @@ int main(int argc, char** argv) {
     add_pairs();
     add_solo();
     add_generated();
+    add_tools();
     const std::string document = add_document(options.documents);
     if (document.empty() && !options.documents.empty()) {
         std::fprintf(stderr, "vorlite_bench: no candidate document has five processors that run\n");

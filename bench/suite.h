@@ -19,6 +19,11 @@ void add_solo();
 // banded frame, gradient shape and flare type on its own, at both sizes.
 void add_generated();
 
+// The tool engine: dabs, a stroke segment and its preview box, the
+// preview, VorToolInit per kind on a 1080 x 1080 preview, and the
+// full-resolution render per kind at both sizes.
+void add_tools();
+
 // The label of one side of a comparison in the catalogue.
 const char* comparison_label(const char* operation, const char* side);
 

@@ -42,20 +42,11 @@ VOR_API void VorWhiten(VorBitmap* image, const VorBitmap* /*second*/) {
     if (image == nullptr || image->height < 1 || image->data == nullptr) return;
     const std::size_t count = std::size_t{image->width} * image->height;
     std::uint8_t* p = image->data;
-    // Photographs repeat colours from pixel to pixel; the last result
-    // stands for a repeated colour, which gives the same bytes as a second
-    // round trip.
-    VorColor last_in{0, 0, 0, 0};
-    VorColor last_out = whiten(last_in);
     for (std::size_t i = 0; i < count; ++i, p += 4) {
-        VorColor colour = vorlite::core::load_pixel(p);
-        if (colour.r != last_in.r || colour.g != last_in.g || colour.b != last_in.b) {
-            last_in = colour;
-            last_out = whiten(colour);
-        }
-        p[0] = last_out.r;
-        p[1] = last_out.g;
-        p[2] = last_out.b;
+        const VorColor out = whiten(vorlite::core::load_pixel(p));
+        p[0] = out.r;
+        p[1] = out.g;
+        p[2] = out.b;
     }
 }
 

@@ -1,7 +1,6 @@
 #include <gtest/gtest.h>
 
 #include <cmath>
-#include <cstring>
 
 #include "tests/test_support.h"
 #include "zentra_vorlite.h"
@@ -67,18 +66,6 @@ TEST(Whiten, YellowedWhiteBrightensAndNeutralisesWhileOtherHuesStay) {
     VorColor round_trip{static_cast<uint8_t>(l), static_cast<uint8_t>(a), static_cast<uint8_t>(b), 5};
     VorColorLAB2RGB(&round_trip);
     EXPECT_EQ(rgba(leaf.pixel(0)), rgba(round_trip));
-}
-
-TEST(Whiten, RepeatedColoursGiveWhatEachPixelGivesAlone) {
-    TestBitmap image(37, 11);
-    for (std::size_t i = 4; i < image.bytes.size(); i += 8) std::memcpy(&image.bytes[i], &image.bytes[i - 4], 3);
-    TestBitmap whole = image;
-    VorWhiten(whole.get(), image.get());
-    for (std::size_t i = 0; i < std::size_t{37} * 11; ++i) {
-        TestBitmap alone(1, 1, image.pixel(i));
-        VorWhiten(alone.get(), nullptr);
-        ASSERT_EQ(rgba(whole.pixel(i)), rgba(alone.pixel(0))) << i;
-    }
 }
 
 }  // namespace
