@@ -79,44 +79,80 @@ inline std::uint32_t mix(std::uint32_t h) {
 }
 
 inline float lattice(std::int32_t ix, std::int32_t iy, std::uint32_t seed) {
-    const std::uint32_t h = mix(static_cast<std::uint32_t>(ix) * 0x9E3779B1u ^ mix(static_cast<std::uint32_t>(iy) + seed));
+    const std::uint32_t h =
+        mix(static_cast<std::uint32_t>(ix) * 0x9E3779B1u + static_cast<std::uint32_t>(iy) * 0x85EBCA77u + seed);
     return static_cast<float>(h >> 8) * 0x1p-24f;
 }
 
 inline float smooth(float t) { return t * t * (3.0f - 2.0f * t); }
 
-// Smooth noise in 0..1 with features about cell pixels across.
+// Floor of a noise coordinate, inline: std::floor is a library call on
+// baseline x86-64, and the noise asks for two per pixel. Coordinates stay
+// far inside the int range (pixel positions over a cell of at least one).
+inline std::int32_t floor_to_int(float v) {
+    const auto i = static_cast<std::int32_t>(v);
+    return i - (v < static_cast<float>(i) ? 1 : 0);
+}
+
+// Smooth noise in 0..1 with features about cell pixels across, sampled a
+// row at a time: the lattice is blended down to the row once, then each
+// pixel blends two neighbouring cells with a weight from its column, formed
+// once a frame. Per pixel that is a few loads and one blend.
 class Noise {
 public:
-    Noise(float cell, std::uint32_t seed) : inv_cell_(1.0f / (cell < 1.0f ? 1.0f : cell)), seed_(seed) {}
-    float at(float x, float y) const {
-        const float fx = x * inv_cell_;
-        const float fy = y * inv_cell_;
-        const float x0 = std::floor(fx);
-        const float y0 = std::floor(fy);
-        const auto ix = static_cast<std::int32_t>(x0);
-        const auto iy = static_cast<std::int32_t>(y0);
-        const float tx = smooth(fx - x0);
-        const float ty = smooth(fy - y0);
-        const float a = lattice(ix, iy, seed_);
-        const float b = lattice(ix + 1, iy, seed_);
-        const float c = lattice(ix, iy + 1, seed_);
-        const float d = lattice(ix + 1, iy + 1, seed_);
-        const float top = a + (b - a) * tx;
-        const float bottom = c + (d - c) * tx;
-        return top + (bottom - top) * ty;
+    // False when memory ran out; the noise may not be used then.
+    bool build(float cell, std::uint32_t seed, std::uint32_t width) {
+        inv_cell_ = 1.0f / (cell < 1.0f ? 1.0f : cell);
+        seed_ = seed;
+        const float cells = static_cast<float>(width) * inv_cell_;
+        if (!columns_.build(width) || !cells_.build(static_cast<std::uint32_t>(cells) + 3u)) return false;
+        for (std::uint32_t x = 0; x < width; ++x) {
+            const float fx = static_cast<float>(x) * inv_cell_;
+            const std::int32_t ix = floor_to_int(fx);
+            columns_[x] = {ix, smooth(fx - static_cast<float>(ix))};
+        }
+        return true;
+    }
+    // Blends the lattice down to row y for the columns x0..x1 - 1.
+    void row(std::uint32_t y, std::uint32_t x0, std::uint32_t x1) {
+        if (x0 >= x1) return;
+        const float fy = static_cast<float>(y) * inv_cell_;
+        const std::int32_t iy = floor_to_int(fy);
+        const float ty = smooth(fy - static_cast<float>(iy));
+        for (std::int32_t c = columns_[x0].cell; c <= columns_[x1 - 1].cell + 1; ++c) {
+            const float a = lattice(c, iy, seed_);
+            cells_[static_cast<std::size_t>(c)] = a + (lattice(c, iy + 1, seed_) - a) * ty;
+        }
+    }
+    // The noise at column x of the last row.
+    float at(std::uint32_t x) const {
+        const Column column = columns_[x];
+        const float a = cells_[static_cast<std::size_t>(column.cell)];
+        return a + (cells_[static_cast<std::size_t>(column.cell) + 1] - a) * column.weight;
     }
 
 private:
-    float inv_cell_;
-    std::uint32_t seed_;
+    struct Column {
+        std::int32_t cell;
+        float weight;
+    };
+    float inv_cell_ = 1.0f;
+    std::uint32_t seed_ = 0;
+    core::WorkingArray<Column> columns_;
+    core::WorkingArray<float> cells_;
 };
 
 // Two octaves, the finer at half weight: blotches with ragged rims.
 class Grunge {
 public:
-    Grunge(float cell, std::uint32_t seed) : coarse_(cell, seed), fine_(cell * 0.25f, mix(seed + 1u)) {}
-    float at(float x, float y) const { return (coarse_.at(x, y) * 2.0f + fine_.at(x, y)) * (1.0f / 3.0f); }
+    bool build(float cell, std::uint32_t seed, std::uint32_t width) {
+        return coarse_.build(cell, seed, width) && fine_.build(cell * 0.25f, mix(seed + 1u), width);
+    }
+    void row(std::uint32_t y, std::uint32_t x0, std::uint32_t x1) {
+        coarse_.row(y, x0, x1);
+        fine_.row(y, x0, x1);
+    }
+    float at(std::uint32_t x) const { return (coarse_.at(x) * 2.0f + fine_.at(x)) * (1.0f / 3.0f); }
 
 private:
     Noise coarse_;
@@ -171,32 +207,44 @@ bool build_profiles(const VorBitmap& bitmap, const ProfileShape& shape, VorRNG* 
     return true;
 }
 
-// Visits each pixel of the band of the given per-side reach once, with its
-// distance inward from each side: top rows, bottom rows, then the left and
-// right columns of the rows between. Work follows the band.
-template <typename Visit>
-void for_each_band_pixel(VorBitmap* bitmap, const float reach[4], Visit&& visit) {
+// Visits once each pixel lying within extra pixels of the frame's edge
+// (the profiles' depth), as spans [x0, x1) of row y: the top rows down to the
+// top profile's deepest point, the bottom rows likewise, and in the rows
+// between only the columns the left and right profiles of that row reach.
+// Work follows the band, not the frame.
+template <typename Span>
+void for_each_band_span(VorBitmap* bitmap, const Profiles& profiles, float extra, Span&& span) {
     const std::uint32_t w = bitmap->width;
     const std::uint32_t h = bitmap->height;
-    const auto extent = [](float r, std::uint32_t limit) {
-        const float c = std::ceil(r);
+    const auto extent = [extra](float depth, std::uint32_t limit) {
+        const float c = std::ceil(depth + extra);
         if (!(c > 0.0f)) return 0u;
         return c >= static_cast<float>(limit) ? limit : static_cast<std::uint32_t>(c);
     };
-    const std::uint32_t top = extent(reach[k_top], h);
-    const std::uint32_t bottom_start = h - extent(reach[k_bottom], h) > top ? h - extent(reach[k_bottom], h) : top;
-    const std::uint32_t left = extent(reach[k_left], w);
-    const std::uint32_t right_start = w - extent(reach[k_right], w) > left ? w - extent(reach[k_right], w) : left;
-    const auto row = [&](std::uint32_t y, std::uint32_t x0, std::uint32_t x1) {
+    const std::uint32_t top = extent(profiles.deepest[k_top], h);
+    const std::uint32_t bottom = extent(profiles.deepest[k_bottom], h);
+    const std::uint32_t bottom_start = h - bottom > top ? h - bottom : top;
+    for (std::uint32_t y = 0; y < top; ++y) span(y, 0u, w);
+    for (std::uint32_t y = top; y < bottom_start; ++y) {
+        const std::uint32_t left = extent(profiles.side[k_left][y], w);
+        const std::uint32_t right = extent(profiles.side[k_right][y], w);
+        if (left > 0) span(y, 0u, left);
+        const std::uint32_t right_start = w - right > left ? w - right : left;
+        if (right_start < w) span(y, right_start, w);
+    }
+    for (std::uint32_t y = bottom_start; y < h; ++y) span(y, 0u, w);
+}
+
+// The same band pixel by pixel: prepare(y, x0, x1) readies the noise of a
+// span's row before visit(p, x, y) is called for each of its pixels.
+template <typename Prepare, typename Visit>
+void for_each_band_pixel(VorBitmap* bitmap, const Profiles& profiles, float extra, Prepare&& prepare,
+                         Visit&& visit) {
+    for_each_band_span(bitmap, profiles, extra, [&](std::uint32_t y, std::uint32_t x0, std::uint32_t x1) {
+        prepare(y, x0, x1);
         std::uint8_t* p = pixel_at(bitmap, x0, y);
         for (std::uint32_t x = x0; x < x1; ++x, p += 4) visit(p, x, y);
-    };
-    for (std::uint32_t y = 0; y < top; ++y) row(y, 0, w);
-    for (std::uint32_t y = top; y < bottom_start; ++y) {
-        row(y, 0, left);
-        row(y, right_start, w);
-    }
-    for (std::uint32_t y = bottom_start; y < h; ++y) row(y, 0, w);
+    });
 }
 
 // How far past the torn edge a pixel lies, the smallest over the sides
@@ -215,6 +263,12 @@ struct EdgeField {
         e = e < dx_left - profiles->side[k_left][y] ? e : dx_left - profiles->side[k_left][y];
         e = e < dx_right - profiles->side[k_right][y] ? e : dx_right - profiles->side[k_right][y];
         return e;
+    }
+    // Distance from the bitmap's own edge.
+    float rim(std::uint32_t x, std::uint32_t y) const {
+        const std::uint32_t a = x < w - 1 - x ? x : w - 1 - x;
+        const std::uint32_t b = y < h - 1 - y ? y : h - 1 - y;
+        return static_cast<float>(a < b ? a : b);
     }
 };
 
@@ -341,9 +395,6 @@ int count_for(const Frame& f, float per_megapixel_side) {
     return static_cast<int>(n + 0.5f);
 }
 
-void reaches(const Profiles& p, float extra, float out[4]) {
-    for (int s = 0; s < 4; ++s) out[s] = p.deepest[s] + extra;
-}
 
 }  // namespace
 }  // namespace vorlite::legacy
@@ -419,27 +470,33 @@ VOR_API void VorGrungeBorder1Legacy(VorBitmap* bitmap, const VorColor* color, ui
     Profiles profiles;
     if (!build_profiles(*bitmap, shape, &f.rng, &profiles)) return;
     const float jag = s * (thin ? 0.012f : 0.02f) * k;
-    const Grunge blotch(s * 0.03f, VorRNGNextInt(&f.rng));
-    const Noise streak(s * 0.004f, VorRNGNextInt(&f.rng));
+    Grunge blotch;
+    Noise streak;
+    if (!blotch.build(s * 0.03f, VorRNGNextInt(&f.rng), bitmap->width) ||
+        !streak.build(s * 0.004f, VorRNGNextInt(&f.rng), bitmap->width)) {
+        return;
+    }
     const float ink = static_cast<float>(color->a) * vorlite::core::k_inv255;
     const EdgeField field{&profiles, bitmap->width, bitmap->height};
-    float reach[4];
-    reaches(profiles, jag + 1.0f, reach);
     const auto r = static_cast<float>(color->r);
     const auto g = static_cast<float>(color->g);
     const auto b = static_cast<float>(color->b);
-    for_each_band_pixel(bitmap, reach, [&](std::uint8_t* p, std::uint32_t x, std::uint32_t y) {
-        const float fx = static_cast<float>(x);
-        const float fy = static_cast<float>(y);
-        const float n = blotch.at(fx, fy);
-        const float e = field.outside(x, y) + (n - 0.5f) * 2.0f * jag;
+    const auto prepare = [&](std::uint32_t y, std::uint32_t x0, std::uint32_t x1) {
+        blotch.row(y, x0, x1);
+        streak.row(y, x0, x1);
+    };
+    for_each_band_pixel(bitmap, profiles, jag + 1.0f, prepare, [&](std::uint8_t* p, std::uint32_t x, std::uint32_t y) {
+        const float e0 = field.outside(x, y);
+        if (e0 >= jag + 0.5f) return;
+        const float n = blotch.at(x);
+        const float e = e0 + (n - 0.5f) * 2.0f * jag;
         const float cover = clamp01(0.5f - e);
         if (cover <= 0.0f) return;
         // Dry brush: the ink thins in streaks near its edge.
-        const float dry = clamp01((e + jag) / (jag + 1.0f)) * streak.at(fx, fy);
+        const float dry = clamp01((e + jag) / (jag + 1.0f)) * streak.at(x);
         lay_over(p, r, g, b, cover * ink * (1.0f - 0.8f * dry));
     });
-    scatter_specks(bitmap, &f.rng, count_for(f, thin ? 20.0f : 30.0f), shape.depth * 3.0f + jag, s * 0.008f,
+    scatter_specks(bitmap, &f.rng, count_for(f, thin ? 40.0f : 70.0f), shape.depth * 3.0f + jag, s * 0.01f,
                    *color);
     const VorColor ink_colour = *color;
     scatter_scratches(bitmap, &f.rng, count_for(f, 2.0f), s, ink_colour, 0.25f * ink, false, false);
@@ -454,26 +511,38 @@ VOR_API void VorGrungeBorder4Legacy(VorBitmap* bitmap, uint32_t seed, double str
     Profiles profiles;
     if (!build_profiles(*bitmap, shape, &f.rng, &profiles)) return;
     const float jag = s * 0.008f * k;
-    const float stain_reach = s * 0.12f * k;
-    const Grunge fibres(s * 0.01f, VorRNGNextInt(&f.rng));
-    const Grunge stains(s * 0.08f, VorRNGNextInt(&f.rng));
+    const float stain_reach = s * 0.05f * k;
+    const float grime_reach = s * 0.012f + 1.0f;
+    Grunge fibres, stains;
+    if (!fibres.build(s * 0.01f, VorRNGNextInt(&f.rng), bitmap->width) ||
+        !stains.build(s * 0.08f, VorRNGNextInt(&f.rng), bitmap->width)) {
+        return;
+    }
     const EdgeField field{&profiles, bitmap->width, bitmap->height};
-    float reach[4];
-    reaches(profiles, stain_reach + jag, reach);
     const float stain = 0.55f * f.strength > 0.9f ? 0.9f : 0.55f * f.strength;
-    for_each_band_pixel(bitmap, reach, [&](std::uint8_t* p, std::uint32_t x, std::uint32_t y) {
-        const float fx = static_cast<float>(x);
-        const float fy = static_cast<float>(y);
-        const float e = field.outside(x, y) + (fibres.at(fx, fy) - 0.5f) * 2.0f * jag;
+    const auto prepare = [&](std::uint32_t y, std::uint32_t x0, std::uint32_t x1) {
+        fibres.row(y, x0, x1);
+        stains.row(y, x0, x1);
+    };
+    for_each_band_pixel(bitmap, profiles, stain_reach + jag, prepare, [&](std::uint8_t* p, std::uint32_t x,
+                                                                          std::uint32_t y) {
+        const float e0 = field.outside(x, y);
+        if (e0 >= stain_reach + jag) return;
+        const float fibre = fibres.at(x);
+        const float e = e0 + (fibre - 0.5f) * 2.0f * jag;
         // Yellowed paper creeping in from the edge, in blotches.
         const float age = 1.0f - clamp01(e / stain_reach);
-        const float blot = clamp01((stains.at(fx, fy) - 0.35f) * 2.5f);
+        const float stain_level = stains.at(x);
+        const float blot = clamp01((stain_level - 0.3f) * 2.5f);
         const float yellow = age * age * blot * stain;
         if (yellow > 0.0f) multiply_over(p, 0.93f, 0.80f, 0.58f, yellow);
         const float cover = clamp01(0.5f - e);
         if (cover > 0.0f) {
-            // Off-white paper, a little darker where it is grubby.
-            const float grime = 1.0f - 0.12f * stains.at(fy, fx);
+            // Off-white paper with its fibres, greyer where it is grubby and
+            // darkest along the outer rim that fingers handled.
+            const float rim = field.rim(x, y) / grime_reach;
+            const float handled = rim < 1.0f ? (1.0f - rim) * (1.0f - rim) * 0.35f : 0.0f;
+            const float grime = (1.0f - 0.1f * (1.0f - stain_level) - 0.06f * fibre) * (1.0f - handled);
             lay_over(p, 238.0f * grime, 232.0f * grime, 216.0f * grime, cover);
         }
     });
@@ -488,20 +557,20 @@ VOR_API void VorGrungeBorder5Legacy(VorBitmap* bitmap, uint32_t seed, double str
     if (!begin_frame(bitmap, seed, strength, &f)) return;
     const float s = f.scale;
     const float k = 0.5f + 0.5f * f.strength;
-    const ProfileShape shape{s * 0.03f * k, s * 0.05f * k, 0.5f, s * 0.06f * k};
+    const ProfileShape shape{s * 0.02f * k, s * 0.035f * k, 0.5f, s * 0.06f * k};
     Profiles profiles;
     if (!build_profiles(*bitmap, shape, &f.rng, &profiles)) return;
     const float jag = s * 0.015f * k;
     const float halo = s * 0.06f * k;
-    const Grunge ember(s * 0.02f, VorRNGNextInt(&f.rng));
+    Grunge ember;
+    if (!ember.build(s * 0.02f, VorRNGNextInt(&f.rng), bitmap->width)) return;
     const EdgeField field{&profiles, bitmap->width, bitmap->height};
-    float reach[4];
-    reaches(profiles, halo + jag, reach);
-    for_each_band_pixel(bitmap, reach, [&](std::uint8_t* p, std::uint32_t x, std::uint32_t y) {
-        const float fx = static_cast<float>(x);
-        const float fy = static_cast<float>(y);
-        const float n = ember.at(fx, fy);
-        const float e = field.outside(x, y) + (n - 0.5f) * 2.0f * jag;
+    const auto prepare = [&](std::uint32_t y, std::uint32_t x0, std::uint32_t x1) { ember.row(y, x0, x1); };
+    for_each_band_pixel(bitmap, profiles, halo + jag, prepare, [&](std::uint8_t* p, std::uint32_t x, std::uint32_t y) {
+        const float e0 = field.outside(x, y);
+        if (e0 >= halo + jag) return;
+        const float n = ember.at(x);
+        const float e = e0 + (n - 0.5f) * 2.0f * jag;
         if (e >= halo) return;
         // The scorch: the print browns, then darkens toward the char line.
         const float near = 1.0f - clamp01(e / halo);
@@ -509,8 +578,8 @@ VOR_API void VorGrungeBorder5Legacy(VorBitmap* bitmap, uint32_t seed, double str
         const float cover = clamp01(0.5f - e);
         if (cover > 0.0f) {
             // Char: near-black, with faint glowing brown where the noise peaks.
-            const float glow = clamp01((n - 0.6f) * 3.0f);
-            lay_over(p, 22.0f + 60.0f * glow, 15.0f + 22.0f * glow, 10.0f, cover);
+            const float glow = clamp01((n - 0.72f) * 4.0f) * clamp01(1.0f + e / jag);
+            lay_over(p, 22.0f + 70.0f * glow, 15.0f + 25.0f * glow, 10.0f, cover);
         }
     });
     const VorColor ash{30, 22, 16, 230};
@@ -539,10 +608,9 @@ VOR_API void VorGrungeBorder6Legacy(VorBitmap* bitmap, uint32_t seed, double str
     }
     for (int side : {landscape ? k_top : k_left, landscape ? k_bottom : k_right}) profiles.deepest[side] += rebate;
     const float jag = s * 0.002f;
-    const Grunge fog(s * 0.01f, VorRNGNextInt(&f.rng));
+    Grunge fog;
+    if (!fog.build(s * 0.01f, VorRNGNextInt(&f.rng), bitmap->width)) return;
     const EdgeField field{&profiles, bitmap->width, bitmap->height};
-    float reach[4];
-    reaches(profiles, jag + 2.0f, reach);
     // Sprocket holes: rounded rectangles centred in the rebate, one pitch
     // apart, lit from behind.
     const float pitch = rebate * 1.05f;
@@ -552,11 +620,14 @@ VOR_API void VorGrungeBorder6Legacy(VorBitmap* bitmap, uint32_t seed, double str
     const float hole_centre = rebate * 0.45f;
     const float phase = VorRNGNextFloat(&f.rng) * pitch;
     const float across_long = landscape ? static_cast<float>(bitmap->height) : static_cast<float>(bitmap->width);
-    for_each_band_pixel(bitmap, reach, [&](std::uint8_t* p, std::uint32_t x, std::uint32_t y) {
+    const auto prepare = [&](std::uint32_t y, std::uint32_t x0, std::uint32_t x1) { fog.row(y, x0, x1); };
+    for_each_band_pixel(bitmap, profiles, jag + 2.0f, prepare, [&](std::uint8_t* p, std::uint32_t x, std::uint32_t y) {
+        const float e0 = field.outside(x, y);
+        if (e0 >= jag + 0.5f) return;
         const float fx = static_cast<float>(x);
         const float fy = static_cast<float>(y);
-        const float n = fog.at(fx, fy);
-        const float e = field.outside(x, y) + (n - 0.5f) * 2.0f * jag;
+        const float n = fog.at(x);
+        const float e = e0 + (n - 0.5f) * 2.0f * jag;
         const float cover = clamp01(0.5f - e);
         if (cover <= 0.0f) return;
         // The base is not quite black: a faint fog in the film's rebate.
@@ -575,7 +646,7 @@ VOR_API void VorGrungeBorder6Legacy(VorBitmap* bitmap, uint32_t seed, double str
     });
     // A light leak: warm light fogging the film from one corner.
     const std::uint32_t corner = VorRNGNextInt(&f.rng) >> 30;
-    const float radius = s * 0.5f * k;
+    const float radius = s * 0.45f;
     const float cx = (corner & 1u) != 0 ? static_cast<float>(bitmap->width) - 1.0f : 0.0f;
     const float cy = (corner & 2u) != 0 ? static_cast<float>(bitmap->height) - 1.0f : 0.0f;
     std::uint32_t x0, x1, y0, y1;

@@ -15,9 +15,9 @@ namespace {
 // The texture is drawn once at 257 x 257 and stretched: the plate's
 // mottling is a few dozen blotches across whatever the resolution.
 constexpr std::uint32_t k_plate = 257;
-constexpr float k_plate_amplitude = 110.0f;
+constexpr float k_plate_amplitude = 170.0f;
 constexpr float k_plate_roughness = 0.85f;
-constexpr float k_plate_opacity = 0.6f;
+constexpr float k_plate_opacity = 0.75f;
 
 // Where column (or row) i of n falls on the plate: the texture cell and the
 // weight of the next one.
