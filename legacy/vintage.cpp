@@ -9,12 +9,13 @@
 namespace vorlite::legacy {
 namespace {
 
-// Red and green lifted by a warm fade, blue held back, each with a floor
-// so that black prints as a warm dark brown.
+// Blacks lifted to a warm dark brown (26, 18, 12) and white dimmed to a
+// cream (245, 232, 200): the tonal range of an aged print, red kept
+// longest and blue lost first.
 constexpr VorColorMatrix k_warm_fade{{
-    0.90f, 0.06f, 0.00f, 22.0f,  //
-    0.03f, 0.86f, 0.02f, 16.0f,  //
-    0.00f, 0.06f, 0.74f, 20.0f,  //
+    0.800f, 0.075f, 0.000f, 26.0f,  //
+    0.030f, 0.790f, 0.027f, 18.0f,  //
+    0.000f, 0.060f, 0.677f, 12.0f,  //
 }};
 constexpr float k_vintage_saturation = 0.7f;
 
