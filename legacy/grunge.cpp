@@ -389,10 +389,13 @@ bool begin_frame(VorBitmap* bitmap, std::uint32_t seed, double strength, Frame* 
     return true;
 }
 
-int count_for(const Frame& f, float per_megapixel_side) {
-    const float n = per_megapixel_side * f.strength *
-                    (static_cast<float>(f.bitmap->width) + static_cast<float>(f.bitmap->height)) / 1000.0f;
-    return static_cast<int>(n + 0.5f);
+// How many specks or scratches a frame scatters: per_side for each side of
+// the size of the smaller side, scaled by the strength. The count follows
+// the photo's proportions, not its resolution, since the details grow with
+// the photo.
+int count_for(const Frame& f, float per_side) {
+    const float sides = (static_cast<float>(f.bitmap->width) + static_cast<float>(f.bitmap->height)) / f.scale;
+    return static_cast<int>(per_side * 0.5f * sides * f.strength + 0.5f);
 }
 
 
