@@ -31,12 +31,15 @@ const Frame k_frames[] = {
 };
 
 TEST(GrungeFrames, StayInsideAnySizeAndKeepAlpha) {
-    const std::pair<uint32_t, uint32_t> sizes[] = {{1, 1}, {2, 2}, {1, 9}, {9, 1}, {3, 257}, {131, 2}, {17, 13}};
+    // Odd and prime sizes, thin strips and a strength far past the cap.
+    const uint32_t sides[] = {1, 2, 3, 5, 13, 31, 257};
     for (const Frame& f : k_frames) {
-        for (auto [w, h] : sizes) {
-            TestBitmap b(w, h, 3);
-            f.draw(b.get(), 11, 2.0);
-            EXPECT_TRUE(b.alpha_kept()) << f.name << " " << w << "x" << h;
+        for (uint32_t w : sides) {
+            for (uint32_t h : sides) {
+                TestBitmap b(w, h, 3);
+                f.draw(b.get(), w * 31 + h, w == h ? 1e9 : 2.0);
+                EXPECT_TRUE(b.alpha_kept()) << f.name << " " << w << "x" << h;
+            }
         }
         VorBitmap empty{nullptr, 0, 0};
         f.draw(&empty, 1, 1.0);
