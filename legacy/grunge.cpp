@@ -183,9 +183,8 @@ bool build_profiles(const VorBitmap& bitmap, const ProfileShape& shape, VorRNG* 
         const std::uint32_t n = s < 2 ? bitmap.width : bitmap.height;
         if (!out->side[s].build(n)) return false;
         float* p = out->side[s].get();
-        const float ends = shape.depth + shape.corner;
-        p[0] = ends;
-        p[n - 1] = ends;
+        p[0] = shape.depth;
+        p[n - 1] = shape.depth;
         if (n > 1) {
             VorMPDRNG(p, 0, static_cast<std::int32_t>(n - 1), shape.amplitude, shape.roughness, VOR_MPD_UNIFORM,
                       rng);
@@ -197,7 +196,7 @@ bool build_profiles(const VorBitmap& bitmap, const ProfileShape& shape, VorRNG* 
         for (std::uint32_t i = 0; i < n; ++i) {
             const float from_end = static_cast<float>(i < n - 1 - i ? i : n - 1 - i);
             const float near = 1.0f - clamp01(from_end / falloff);
-            float v = p[i] + shape.corner * near * near - (i == 0 || i == n - 1 ? shape.corner : 0.0f);
+            float v = p[i] + shape.corner * near * near;
             v = v < 0.0f ? 0.0f : v;
             p[i] = v;
             deepest = v > deepest ? v : deepest;
@@ -389,21 +388,23 @@ bool begin_frame(VorBitmap* bitmap, std::uint32_t seed, double strength, Frame* 
     return true;
 }
 
+inline constexpr int k_most_details = 4000;
+
 // How many specks or scratches a frame scatters: per_side for each side of
 // the size of the smaller side, scaled by the strength. The count follows
 // the photo's proportions, not its resolution, since the details grow with
 // the photo.
 int count_for(const Frame& f, float per_side) {
     const float sides = (static_cast<float>(f.bitmap->width) + static_cast<float>(f.bitmap->height)) / f.scale;
-    return static_cast<int>(per_side * 0.5f * sides * f.strength + 0.5f);
+    const float n = per_side * 0.5f * sides * f.strength + 0.5f;
+    // A strip thousands of times longer than wide would ask for millions.
+    return n > static_cast<float>(k_most_details) ? k_most_details : static_cast<int>(n);
 }
-
 
 }  // namespace
 }  // namespace vorlite::legacy
 
 using namespace vorlite::legacy;
-using vorlite::core::store_rounded;
 
 extern "C" {
 
@@ -468,7 +469,7 @@ VOR_API void VorGrungeBorder1Legacy(VorBitmap* bitmap, const VorColor* color, ui
     const bool thin = (variant & 1) != 0;
     const float s = f.scale;
     const float k = 0.5f + 0.5f * f.strength;
-    const ProfileShape shape{s * (thin ? 0.018f : 0.035f) * k, s * (thin ? 0.02f : 0.04f) * k, thin ? 0.45f : 0.6f,
+    const ProfileShape shape{s * (thin ? 0.038f : 0.055f) * k, s * (thin ? 0.02f : 0.04f) * k, thin ? 0.45f : 0.6f,
                              s * 0.02f * k};
     Profiles profiles;
     if (!build_profiles(*bitmap, shape, &f.rng, &profiles)) return;
@@ -510,7 +511,7 @@ VOR_API void VorGrungeBorder4Legacy(VorBitmap* bitmap, uint32_t seed, double str
     if (!begin_frame(bitmap, seed, strength, &f)) return;
     const float s = f.scale;
     const float k = 0.5f + 0.5f * f.strength;
-    const ProfileShape shape{s * 0.03f * k, s * 0.02f * k, 0.55f, s * 0.03f * k};
+    const ProfileShape shape{s * 0.06f * k, s * 0.02f * k, 0.55f, s * 0.03f * k};
     Profiles profiles;
     if (!build_profiles(*bitmap, shape, &f.rng, &profiles)) return;
     const float jag = s * 0.008f * k;
@@ -560,7 +561,7 @@ VOR_API void VorGrungeBorder5Legacy(VorBitmap* bitmap, uint32_t seed, double str
     if (!begin_frame(bitmap, seed, strength, &f)) return;
     const float s = f.scale;
     const float k = 0.5f + 0.5f * f.strength;
-    const ProfileShape shape{s * 0.02f * k, s * 0.035f * k, 0.5f, s * 0.06f * k};
+    const ProfileShape shape{s * 0.07f * k, s * 0.035f * k, 0.5f, s * 0.06f * k};
     Profiles profiles;
     if (!build_profiles(*bitmap, shape, &f.rng, &profiles)) return;
     const float jag = s * 0.015f * k;
@@ -597,7 +598,7 @@ VOR_API void VorGrungeBorder6Legacy(VorBitmap* bitmap, uint32_t seed, double str
     const bool landscape = bitmap->width >= bitmap->height;
     // The film-gate edge is much straighter than a torn one: small amplitude,
     // rounded corners of the gate.
-    const ProfileShape shape{s * 0.02f * k, s * 0.004f * k, 0.8f, s * 0.012f * k};
+    const ProfileShape shape{s * 0.03f * k, s * 0.004f * k, 0.8f, s * 0.012f * k};
     Profiles profiles;
     if (!build_profiles(*bitmap, shape, &f.rng, &profiles)) return;
     // The rebate carrying the sprocket holes runs along the long sides.
