@@ -97,8 +97,7 @@ TEST(BWHueMix, AmountBlendsTheGreyOverThePhoto) {
     for (std::size_t i = 0; i < 17 * 5; ++i) {
         const VorColor m = mono.pixel(i);
         ASSERT_TRUE(m.r == m.g && m.g == m.b) << i;
-        VorColor expected = half.pixel(i);
-        expected = {half.before[4 * i], half.before[4 * i + 1], half.before[4 * i + 2], half.before[4 * i + 3]};
+        VorColor expected{half.before[4 * i], half.before[4 * i + 1], half.before[4 * i + 2], half.before[4 * i + 3]};
         VorColorBlend(&expected, &m, VOR_BLEND_NORMAL, 0.35f);
         EXPECT_EQ(rgba(half.pixel(i)), rgba(expected)) << i;
     }
