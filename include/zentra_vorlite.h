@@ -921,6 +921,83 @@ VOR_API void VorFlareLegacyCorvale(VorBitmap* bitmap, const VLPLRunOptions* opti
 VOR_API void VorFlareLegacyEmberly(VorBitmap* bitmap, const VLPLRunOptions* options);
 
 /* ====================================================================== */
+/* Legacy catalogue                                                       */
+/* ====================================================================== */
+
+/* The named ready-made effects of the "legacyProcessor" catalogue. Each
+ * takes the bitmap and the run options: the seed feeds its generator, the
+ * strength scales it. Borders draw whatever bordersEnabled says; the
+ * processor is what gates them. Alpha kept unless noted. */
+VOR_API void VorLegacyGlimmoTintypeDiamondSquare(VorBitmap* bitmap,
+                                                 const VLPLRunOptions* options);
+VOR_API void VorLegacyGlimmoVintageColorMatrixTransform(VorBitmap* bitmap,
+                                                        const VLPLRunOptions* options);
+VOR_API void VorLegacyMurmelGrittyPSSat(VorBitmap* bitmap, const VLPLRunOptions* options);
+VOR_API void VorLegacyMurmelGrittyDots(VorBitmap* bitmap, const VLPLRunOptions* options);
+VOR_API void VorLegacyMurmelBWPSSat(VorBitmap* bitmap, const VLPLRunOptions* options);
+VOR_API void VorLegacyMurmelCinematicPSSat(VorBitmap* bitmap, const VLPLRunOptions* options);
+
+/* ---------------------------------------------------------------------- */
+/* Black and white, grit and film textures                                */
+/* ---------------------------------------------------------------------- */
+
+/* Hue weights of the black-and-white mix, one per hue sector: reds,
+ * yellows, greens, cyans, blues, magentas (hues 0, 60, ... 300 degrees). */
+typedef struct VorBWHueWeights {
+    float weight[6];
+} VorBWHueWeights;
+
+/* Sets the six weights from percentages (100 keeps a fully saturated hue
+ * as bright as its brightest channel, 0 makes it as dark as its darkest),
+ * each clamped to -200..300. */
+VOR_API void VorLegacyPhotoshopBWSatWeightsSet(VorBWHueWeights* weights, float reds, float yellows,
+                                               float greens, float cyans, float blues,
+                                               float magentas);
+/* Black and white weighted per hue: each pixel's grey is its darkest
+ * channel plus its chroma times the weight of its hue (a grey stays the
+ * same grey); with punch non-zero the grey passes a hard S-curve for a
+ * gritty contrast. The grey is laid over the photo with opacity amount
+ * (0 keeps the photo, 1 is fully monochrome). Alpha kept. */
+VOR_API void VorLegacyPhotoshopBWSat(VorBitmap* bitmap, const VorBWHueWeights* weights, float amount,
+                                     int32_t punch);
+/* Seeded grit: small dark and light specks, sized with the photo, covering
+ * about density of its area (0.05 is a coarse grain); monochrome non-zero
+ * shifts red, green and blue alike, else each speck is tinted. Alpha kept. */
+VOR_API void VorLegacyGrittyDots(VorBitmap* bitmap, float density, int32_t monochrome, uint32_t seed);
+
+/* ---------------------------------------------------------------------- */
+/* Grunge frames                                                          */
+/* ---------------------------------------------------------------------- */
+
+/* The worn frames of the catalogue. Each is seeded (same seed, same
+ * pixels), sized with the photo's smaller side, and touches mostly a band
+ * along the edges; strength 1 is the designed look, 0 draws nothing, up to
+ * 2 adds grunge. Alpha kept. */
+/* Rough brushed ink edge in the colour (its alpha the ink's opacity) with
+ * spatter and dry-brush wear; variant 0 a broad edge, 1 a thinner,
+ * scratchier one (others as variant mod 2). */
+VOR_API void VorGrungeBorder1Legacy(VorBitmap* bitmap, const VorColor* color, uint32_t seed,
+                                    int32_t variant, double strength);
+/* Worn paper print: a torn off-white edge, yellowed stains, frayed
+ * corners, dust and fine scratches. */
+VOR_API void VorGrungeBorder4Legacy(VorBitmap* bitmap, uint32_t seed, double strength);
+/* Burnt print: a charred ragged edge with a brown scorch halo, burnt-in
+ * corners and ash specks. */
+VOR_API void VorGrungeBorder5Legacy(VorBitmap* bitmap, uint32_t seed, double strength);
+/* Film rebate: a black film-gate edge with sprocket holes along the long
+ * sides, a warm light leak at a corner, dust and long scratches. */
+VOR_API void VorGrungeBorder6Legacy(VorBitmap* bitmap, uint32_t seed, double strength);
+/* One round dot of the colour centred at (x, y), radius in pixels with a
+ * one-pixel antialiased rim, laid over at opacity x colour alpha / 255;
+ * clipped to the bitmap; alpha kept. */
+VOR_API void VorDrawBasicDotLegacy(VorBitmap* bitmap, float x, float y, float radius,
+                                   const VorColor* color, float opacity);
+/* One speck of dirt about size pixels across at (x, y): a seeded clump of
+ * basic dots, now and then trailing a thin fibre; clipped; alpha kept. */
+VOR_API void VorDirtSpecLegacy(VorBitmap* bitmap, float x, float y, float size, const VorColor* color,
+                               uint32_t seed);
+
+/* ====================================================================== */
 /* Masks                                                                  */
 /* ====================================================================== */
 
