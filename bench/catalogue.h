@@ -51,7 +51,7 @@ inline constexpr Comparison kComparisons[] = {
     {"sharpen", "VorConvolutionEffectKipSharpen, amount 100", "vips", "vips_gaussblur (blur only, same sigma)",
      0.0},
     {"blend", "VorBitmapBlendBitmap, normal, opacity 0.5", "opencv", "cv::addWeighted 0.5 / 0.5", 1.5},
-    {"noise", "VorBitmapAddNoise, intensity 0.1", "opencv", "cv::randu + cv::add", 0.6},
+    {"noise", "VorBitmapAddNoise, intensity 0.1", "opencv", "cv::randu over [0, 64) + cv::add", 0.6},
     {"vignette", "VorVignette, multiply, stretched, scale 0.6", "memcpy", "memcpy of the same bytes", 5.0},
     {"gradient", "VorGradientApply, linear, overlay", "memcpy", "memcpy of the same bytes", 5.0},
 };

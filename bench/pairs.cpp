@@ -122,7 +122,7 @@ void add_noise(const BitmapSize& size) {
     });
     add_pair("noise", "opencv", size, [size](benchmark::State& state) {
         cv::Mat noise;
-        time_in_place(state, sample(size), [&noise](cv::Mat& image) { noise_opencv(image, noise, kNoiseIntensity); });
+        time_in_place(state, sample(size), [&noise](cv::Mat& image) { noise_opencv(image, noise); });
     });
 }
 

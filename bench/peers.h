@@ -42,9 +42,9 @@ bool gaussblur_vips(const cv::Mat& src, cv::Mat& dst, double sigma);
 // dst = (1 - opacity) x dst + opacity x over, every channel.
 void blend_opencv(cv::Mat& dst, const cv::Mat& over, double opacity);
 
-// Adds uniform noise of up to +-intensity x 255 to red, green and blue,
-// saturating; noise is working storage.
-void noise_opencv(cv::Mat& image, cv::Mat& noise, float intensity);
+// Adds uniform noise over [0, 64) to red, green and blue, saturating: the
+// power-of-two span randu draws fastest; noise is working storage.
+void noise_opencv(cv::Mat& image, cv::Mat& noise);
 
 }  // namespace vorlite::bench
 

@@ -21,6 +21,12 @@ inline float rng_unit_float(std::uint32_t state) {
     return static_cast<float>(state) * 0x1p-32f;
 }
 
+// Grain, drawn eight generator steps at a time in lanes where the lanes are
+// exact (lanes = true), or one draw at a time: the reference the lanes are
+// held against.
+void add_noise(VorBitmap* bitmap, float intensity, std::uint32_t seed, bool lanes);
+void add_channel_noise(VorBitmap* bitmap, float intensity, std::uint32_t seed, bool lanes);
+
 // Integral images: the sum over the inclusive rectangle x0..x1, y0..y1 of a
 // width-wide sum table, modulo 2^32 (four reads whatever the box size).
 inline std::uint32_t box_sum(const std::uint32_t* sums, std::uint32_t width, std::uint32_t x0,

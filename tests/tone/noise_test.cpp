@@ -1,8 +1,10 @@
 #include <gtest/gtest.h>
 
+#include <limits>
 #include <tuple>
 
 #include "tests/test_support.h"
+#include "tone/tone_internal.h"
 
 namespace {
 
@@ -51,3 +53,22 @@ TEST(NoiseProcessor, ScalesIntensityByStrengthSameSeedSamePixelsAndRejectsBadInt
 }
 
 }  // namespace
+
+TEST(Grain, LanesReplayTheSerialDrawsExactly) {
+    const float intensities[] = {0.1f, 1.0f, -0.37f, 4000.0f, 1e30f, std::numeric_limits<float>::quiet_NaN()};
+    const std::pair<uint32_t, uint32_t> sizes[] = {{1, 1}, {7, 1}, {1, 9}, {13, 11}, {97, 61}};
+    for (const float intensity : intensities) {
+        for (const auto& [w, h] : sizes) {
+            for (const uint32_t seed : {0u, 1u, 0xFFFFFFFFu}) {
+                vorlite::test::TestBitmap lanes(w, h, seed), reference(w, h, seed);
+                vorlite::tone::add_noise(lanes.get(), intensity, seed, true);
+                vorlite::tone::add_noise(reference.get(), intensity, seed, false);
+                EXPECT_TRUE(lanes == reference) << intensity << " " << w << "x" << h << " " << seed;
+                vorlite::test::TestBitmap colour_lanes(w, h, seed), colour_reference(w, h, seed);
+                vorlite::tone::add_channel_noise(colour_lanes.get(), intensity, seed, true);
+                vorlite::tone::add_channel_noise(colour_reference.get(), intensity, seed, false);
+                EXPECT_TRUE(colour_lanes == colour_reference) << intensity << " " << w << "x" << h << " " << seed;
+            }
+        }
+    }
+}
