@@ -21,7 +21,7 @@ int run_adjust(const AdjustArgs& args) {
     require_format(args.output);
     const std::pair<const std::optional<double>&, Slider> sliders[] = {
         {args.brightness, VorToolBrightness}, {args.contrast, VorToolContrast},
-        {args.saturation, VorToolSaturation}, {args.warmth, VorToolWarmth},
+        {args.warmth, VorToolWarmth}, {args.saturation, VorToolSaturation},
         {args.sharpness, VorToolSharpness}};
     bool any = false;
     for (const auto& [value, tool] : sliders) any = any || value.has_value();
@@ -29,8 +29,16 @@ int run_adjust(const AdjustArgs& args) {
 
     Image image = read_image(args.input);
     VorBitmap bitmap = image.bitmap();
-    for (const auto& [value, tool] : sliders) {
-        if (value) tool(&bitmap, nullptr, *value);
+    if (!args.sharpness) {
+        // The four tone sliders alone: the library's one call, which is what
+        // a phone's slider panel runs.
+        VorToolAdjustBrightnessContrastWarmthSaturation(&bitmap, args.brightness.value_or(0.0),
+                                                        args.contrast.value_or(0.0), args.warmth.value_or(0.0),
+                                                        args.saturation.value_or(0.0));
+    } else {
+        for (const auto& [value, tool] : sliders) {
+            if (value) tool(&bitmap, nullptr, *value);
+        }
     }
     write_image(image, args.output, args.quality);
     return 0;

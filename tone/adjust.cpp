@@ -94,4 +94,16 @@ VOR_API void VorToolSharpness(VorBitmap* bitmap, const void* /*params*/, double 
     VorConvolutionEffectKipSharpen(bitmap, static_cast<float>(value));
 }
 
+// A host's four tone sliders in one call, in the order their effects
+// stack on a phone: exposure first, then contrast on the new tones, then
+// colour temperature, and saturation last so it works on the final hues.
+VOR_API void VorToolAdjustBrightnessContrastWarmthSaturation(VorBitmap* bitmap, double brightness,
+                                                             double contrast, double warmth,
+                                                             double saturation) {
+    VorToolBrightness(bitmap, nullptr, brightness);
+    VorToolContrast(bitmap, nullptr, contrast);
+    VorToolWarmth(bitmap, nullptr, warmth);
+    VorToolSaturation(bitmap, nullptr, saturation);
+}
+
 }  // extern "C"

@@ -84,3 +84,17 @@ TEST(AdjustmentTools, WorkedLevelsAtTheEnds) {
 }
 
 }  // namespace
+
+TEST(AdjustSliders, OneCallIsTheFourToolsInOrder) {
+    const double settings[][4] = {{0, 0, 0, 0}, {35, -20, 60, -45}, {-100, 100, -100, 100}};
+    for (const auto& s : settings) {
+        vorlite::test::TestBitmap together(37, 11), apart(37, 11);
+        VorToolAdjustBrightnessContrastWarmthSaturation(together.get(), s[0], s[1], s[2], s[3]);
+        VorToolBrightness(apart.get(), nullptr, s[0]);
+        VorToolContrast(apart.get(), nullptr, s[1]);
+        VorToolWarmth(apart.get(), nullptr, s[2]);
+        VorToolSaturation(apart.get(), nullptr, s[3]);
+        EXPECT_TRUE(together == apart) << s[0] << " " << s[1] << " " << s[2] << " " << s[3];
+        EXPECT_TRUE(together.alpha_kept());
+    }
+}
