@@ -70,7 +70,14 @@ public:
             amplitude_ = std::max(amplitude_, 0.0015f * sum * tuning(p.sideTune6, 0.0f, 4.0f, 1.0f));
         }
         if (style_ == VOR_BORDER_ROUND) corner_ = tuning(p.sideTune5, 0.0f, 4.0f, 1.5f) * depth_;
-        if (style_ == VOR_BORDER_GLIMMO) amplitude_ = std::max(amplitude_, 0.35f * depth_);
+        if (style_ == VOR_BORDER_GLIMMO) {
+            // A wet plate's dark edge is a margin of the plate, never a
+            // tunnel: a record left at its full default width still leaves
+            // the picture open.
+            depth_ = std::min(depth_, 0.1f * shorter);
+            softness_ = std::max(1.0f, tuning(p.sideTune3, 0.0f, 4.0f, 1.0f) * depth_ * 0.5f);
+            amplitude_ = std::max(amplitude_, 0.35f * depth_);
+        }
     }
 
     // The deepest the band can reach, so rows and columns beyond it are skipped.

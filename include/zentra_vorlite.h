@@ -199,12 +199,13 @@ VOR_API float VLPLBlendAroundIdentity(float value, float identity, float strengt
 /* "original": no keys; the pixels stay as they are. */
 VOR_API int VLPLRunOriginalProcessor(const yajl_val parameters, VorBitmap* bitmap,
                                      const VLPLRunOptions* options);
-/* "vignette": "color" (colour), "shape" (object), "blendMode". Not in this
- * build yet: returns 0. */
+/* "vignette": "color" (colour), "shape" (object), "blendMode"; the
+ * strength divides the radius. */
 VOR_API int VLPLRunVignetteProcessor(const yajl_val parameters, VorBitmap* bitmap,
                                      const VLPLRunOptions* options);
-/* "legacyProcessor": the named legacy effects. Not in this build yet:
- * returns 0. */
+/* "legacyProcessor": "legacyName", one of the 38 names of the legacy
+ * catalogue; 0 for another name or a non-string. Borders other than the two
+ * glimmo ones draw only while bordersEnabled is set, yet return 1. */
 VOR_API int VLPLRunLegacyProcessor(const yajl_val parameters, VorBitmap* bitmap,
                                    const VLPLRunOptions* options);
 /* "histogramMapping": "histMap" {"r", "g", "b": 256 levels each}, faded
@@ -245,7 +246,10 @@ VOR_API int VLPLRunNoiseProcessor(const yajl_val parameters, VorBitmap* bitmap,
  * "blendMode"; the sharpened copy is laid over at alpha x strength. */
 VOR_API int VLPLRunSharpnessProcessor(const yajl_val parameters, VorBitmap* bitmap,
                                       const VLPLRunOptions* options);
-/* "gradient": a colour gradient. Not in this build yet: returns 0. */
+/* "gradient": "colors" and "opacities" (stop arrays), "gradientShape"
+ * ("linear", "radial", "linearVignette"), "scale", "xCenter", "yCenter",
+ * "angle" (degrees), "alpha", "vignetteShape", "blendMode"; the strength
+ * scales the opacity. */
 VOR_API int VLPLRunGradientProcessor(const yajl_val parameters, VorBitmap* bitmap,
                                      const VLPLRunOptions* options);
 
@@ -500,6 +504,13 @@ VOR_API void VorToolWarmth(VorBitmap* bitmap, const void* params, double value);
 /* Value unclamped: two-pass box-hybrid filter at that amount, sharpening
  * above 0 and blurring below; alpha kept. */
 VOR_API void VorToolSharpness(VorBitmap* bitmap, const void* params, double value);
+/* The four tone sliders of a host in one call, each -100..100 with 0 for
+ * no change, applied in this order: VorToolBrightness, VorToolContrast,
+ * VorToolWarmth, VorToolSaturation. All four at 0 give exactly what the
+ * four tools at 0 give. Alpha kept. */
+VOR_API void VorToolAdjustBrightnessContrastWarmthSaturation(VorBitmap* bitmap, double brightness,
+                                                             double contrast, double warmth,
+                                                             double saturation);
 
 /* ====================================================================== */
 /* Auto colours                                                           */
@@ -937,6 +948,42 @@ VOR_API void VorLegacyMurmelGrittyDots(VorBitmap* bitmap, const VLPLRunOptions* 
 VOR_API void VorLegacyMurmelBWPSSat(VorBitmap* bitmap, const VLPLRunOptions* options);
 VOR_API void VorLegacyMurmelCinematicPSSat(VorBitmap* bitmap, const VLPLRunOptions* options);
 
+/* The frames built from the border styles (seeded by the run where torn). */
+VOR_API void VorEffectMarTessaBorder(VorBitmap* bitmap, const VLPLRunOptions* options);
+VOR_API void VorEffectKipCoolBorder(VorBitmap* bitmap, const VLPLRunOptions* options);
+VOR_API void VorEffectSkarnBorder(VorBitmap* bitmap, const VLPLRunOptions* options);
+VOR_API void VorEffectNerioBorder(VorBitmap* bitmap, const VLPLRunOptions* options);
+VOR_API void VorEffectKvantBorder(VorBitmap* bitmap, const VLPLRunOptions* options);
+VOR_API void VorEffectHolmvaleBorder(VorBitmap* bitmap, const VLPLRunOptions* options);
+/* Leaves one array of the larger side allocated on every call. */
+VOR_API void VorEffectDuskoBorder(VorBitmap* bitmap, const VLPLRunOptions* options);
+VOR_API void VorEffectBichromeBorder(VorBitmap* bitmap, const VLPLRunOptions* options);
+VOR_API void VorEffectPallorBorder(VorBitmap* bitmap, const VLPLRunOptions* options);
+VOR_API void VorEffectCorvaleBorder(VorBitmap* bitmap, const VLPLRunOptions* options);
+VOR_API void VorEffectEmberlyBorder(VorBitmap* bitmap, const VLPLRunOptions* options);
+VOR_API void VorEffectOldKvantBorder(VorBitmap* bitmap, const VLPLRunOptions* options);
+VOR_API void VorEffectGlimmoBWBorder(VorBitmap* bitmap, const VLPLRunOptions* options);
+VOR_API void VorEffectGlimmoTintypeBorder(VorBitmap* bitmap, const VLPLRunOptions* options);
+/* The grunge frames with the run's seed and strength. */
+VOR_API void VorEffectTerrowBorder(VorBitmap* bitmap, const VLPLRunOptions* options);
+VOR_API void VorEffectZenitBorder(VorBitmap* bitmap, const VLPLRunOptions* options);
+VOR_API void VorEffectLiragriffinBorder(VorBitmap* bitmap, const VLPLRunOptions* options);
+VOR_API void VorEffectTawnetBorder(VorBitmap* bitmap, const VLPLRunOptions* options);
+/* The camera displays with the run's seed (and strength for Kairo). */
+VOR_API void VorEffectNarwBorder(VorBitmap* bitmap, const VLPLRunOptions* options);
+VOR_API void VorEffectKairoBorder(VorBitmap* bitmap, const VLPLRunOptions* options);
+VOR_API void VorEffectColosBorder(VorBitmap* bitmap, const VLPLRunOptions* options);
+VOR_API void VorEffectLanaiBorder(VorBitmap* bitmap, const VLPLRunOptions* options);
+VOR_API void VoeEffectClaretBorder(VorBitmap* bitmap, const VLPLRunOptions* options);
+VOR_API void VorEffectUmbraBorder(VorBitmap* bitmap, const VLPLRunOptions* options);
+/* VorConvolutionEffectSoftFocus. */
+VOR_API void VorLegacySoftFocus(VorBitmap* bitmap, const VLPLRunOptions* options);
+/* Levels faded by the run's strength toward a warm cream ceiling. */
+VOR_API void VorLegacyMarTessaAutoColors(VorBitmap* bitmap, const VLPLRunOptions* options);
+/* A fixed brown-toned monochrome colour matrix. */
+VOR_API void VorLegacyGlimmoTintypeColorMatrixTransform(VorBitmap* bitmap,
+                                                        const VLPLRunOptions* options);
+
 /* ---------------------------------------------------------------------- */
 /* Black and white, grit and film textures                                */
 /* ---------------------------------------------------------------------- */
@@ -964,6 +1011,42 @@ VOR_API void VorLegacyPhotoshopBWSat(VorBitmap* bitmap, const VorBWHueWeights* w
  * about density of its area (0.05 is a coarse grain); monochrome non-zero
  * shifts red, green and blue alike, else each speck is tinted. Alpha kept. */
 VOR_API void VorLegacyGrittyDots(VorBitmap* bitmap, float density, int32_t monochrome, uint32_t seed);
+
+/* ---------------------------------------------------------------------- */
+/* Dot-matrix text and camera displays                                    */
+/* ---------------------------------------------------------------------- */
+
+/* One round dot of the colour centred at (x, y) with a one-pixel soft rim,
+ * blended in the mode at the colour's alpha; clipped; alpha kept. */
+VOR_API void VorDotMatrixDot(VorBitmap* bitmap, float x, float y, float radius, const VorColor* color,
+                             uint32_t mode);
+/* Text in a 5 x 7 dot-matrix font with its top-left dot at (x, y), dots
+ * pitch pixels apart and a character every 6 dots. The font has the space,
+ * the marks % & ~ { } ^ > < : - + . / * | @, the capitals, "f", "s" and the
+ * digits; other small letters print as capitals, other characters as
+ * blanks. Clipped; alpha kept. */
+VOR_API void VorDotMatrix(VorBitmap* bitmap, const char* text, float x, float y, float pitch,
+                          const VorColor* color, uint32_t mode);
+/* An anti-aliased line of the given width with round ends; clipped;
+ * alpha kept. */
+VOR_API void VorDrawLine(VorBitmap* bitmap, float x0, float y0, float x1, float y1, float width,
+                         const VorColor* color, uint32_t mode);
+/* The displays, each sized by the smaller side; alpha kept. 2: a film
+ * compact's orange date stamp of a seeded day. 3: a camcorder viewfinder
+ * with REC lamp, battery, corners and a time code from the value. 4: an
+ * autofocus finder's focus frame and exposure read-out, at strength 0..1.
+ * 5: a travel stamp of a seeded place with coordinates. 6: today's date.
+ * 7: a digital compact's grid, mode, battery, flash lamp and exposure. */
+VOR_API void VorCameraDisplay2Legacy(VorBitmap* bitmap, uint32_t seed);
+VOR_API void VorCameraDisplay3Legacy(VorBitmap* bitmap, uint32_t value);
+VOR_API void VorCameraDisplay4Legacy(VorBitmap* bitmap, uint32_t seed, double strength);
+VOR_API void VorCameraDisplay5Legacy(VorBitmap* bitmap, uint32_t seed);
+VOR_API void VorCameraDisplay6Legacy(VorBitmap* bitmap);
+VOR_API void VorCameraDisplay7Legacy(VorBitmap* bitmap, uint32_t seed);
+/* A white print border with today's date in its lower band. */
+VOR_API void VorEffectVeskBorder(VorBitmap* bitmap, const VLPLRunOptions* options);
+/* A red film-rebate edge with frame numbers along it, seeded. */
+VOR_API void VorEffectRubraBorder(VorBitmap* bitmap, const VLPLRunOptions* options);
 
 /* ---------------------------------------------------------------------- */
 /* Grunge frames                                                          */

@@ -1,6 +1,6 @@
-// The mottled plate of a tintype: a diamond-square texture stretched over
-// the photo and laid on in overlay, so the plate's blotches lighten and
-// darken the picture without greying it.
+// The tintype: a mottled plate, a diamond-square texture stretched over
+// the photo and laid on in overlay so its blotches lighten and darken the
+// picture without greying it; and the plate's brown-toned colour matrix.
 #include <cstddef>
 #include <cstdint>
 #include <utility>
@@ -94,6 +94,14 @@ VOR_API void VorLegacyGlimmoTintypeDiamondSquare(VorBitmap* bitmap, const VLPLRu
             p[2] = row[p[2]];
         }
     }
+}
+
+// The tintype's brown-toned monochrome: every channel a warm mix of all
+// three, green weighted most.
+VOR_API void VorLegacyGlimmoTintypeColorMatrixTransform(VorBitmap* bitmap, const VLPLRunOptions* /*options*/) {
+    const VorColorMatrix matrix = {{0.6965f, 0.3845f, 0.0945f, 0.0f, 0.1745f, 0.843f, 0.084f, 0.0f, 0.136f, 0.267f,
+                                    0.5655f, 0.0f}};
+    VorBitmapColorMatrixTransform(bitmap, &matrix);
 }
 
 }  // extern "C"
