@@ -107,6 +107,7 @@ int main(int argc, char** argv) {
     add_solo();
     add_generated();
     add_tools();
+    add_legacy();
     const std::string document = add_document(options.documents);
     if (document.empty() && !options.documents.empty()) {
         std::fprintf(stderr, "vorlite_bench: no candidate document has five processors that run\n");

@@ -24,6 +24,10 @@ void add_generated();
 // full-resolution render per kind at both sizes.
 void add_tools();
 
+// Every effect of the legacy catalogue at both sizes, and memcpy beside
+// them.
+void add_legacy();
+
 // The label of one side of a comparison in the catalogue.
 const char* comparison_label(const char* operation, const char* side);
 

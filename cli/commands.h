@@ -7,6 +7,7 @@
 #include <filesystem>
 #include <optional>
 #include <string>
+#include <vector>
 
 #include "zentra_vorlite.h"
 
@@ -69,6 +70,27 @@ struct PaintArgs {
     int quality = kDefaultQuality;
 };
 
+// One named effect of the legacy catalogue.
+struct LegacyArgs {
+    std::string name;
+    std::filesystem::path input, output;
+    RunSettings run;
+    bool list = false;
+    int quality = kDefaultQuality;
+};
+
+struct LegacyEffect {
+    const char* name;
+    const char* description;
+    bool border;  // drawn only while borders are enabled
+};
+
+// The catalogue's 38 names in its order, each with a line saying what it does.
+const std::vector<LegacyEffect>& legacy_effects();
+// Runs one named effect as a document's "legacyProcessor" would; false for
+// a name the library does not know.
+bool run_legacy_effect(const std::string& name, VorBitmap* bitmap, const VLPLRunOptions& options);
+
 // The tool names a paint script may use, comma-separated.
 std::string tool_kind_list();
 
@@ -80,5 +102,6 @@ int run_batch(const BatchArgs& args);
 int run_info();
 int run_gallery(const GalleryArgs& args);
 int run_paint(const PaintArgs& args);
+int run_legacy(const LegacyArgs& args);
 
 }  // namespace vorlite::cli

@@ -283,6 +283,22 @@ std::vector<Sample> gradient_samples() {
     return samples;
 }
 
+// Every effect of the legacy catalogue, borders enabled, seed 1.
+std::vector<Sample> legacy_samples() {
+    std::vector<Sample> samples;
+    for (const LegacyEffect& effect : legacy_effects()) {
+        const std::string name = effect.name;
+        samples.push_back({name, [name](VorBitmap* b) {
+                               VLPLRunOptions o;
+                               VorEffectInitParams(&o);
+                               o.seed = 1;
+                               o.bordersEnabled = 1;
+                               run_legacy_effect(name, b, o);
+                           }});
+    }
+    return samples;
+}
+
 }  // namespace
 
 int run_gallery(const GalleryArgs& args) {
@@ -300,7 +316,10 @@ int run_gallery(const GalleryArgs& args) {
     if (error) throw Failure(args.output_dir.string() + ": cannot create the folder (" + error.message() + ")");
     const Image tile = scaled_down(photo, k_tile_width);
     const std::pair<const char*, std::vector<Sample>> families[] = {
-        {"borders", border_samples()}, {"flares", flare_samples()}, {"gradients", gradient_samples()}};
+        {"borders", border_samples()},
+        {"flares", flare_samples()},
+        {"gradients", gradient_samples()},
+        {"legacy", legacy_samples()}};
     for (const auto& [name, samples] : families) {
         const std::filesystem::path out = args.output_dir / (std::string(name) + "." + args.format);
         const Image sheet = contact_sheet(tile, samples);

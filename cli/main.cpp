@@ -36,10 +36,17 @@ CLI::Validator finite_in(double low, double high) {
         "NUMBER in " + range.str());
 }
 
+// The one PNG setting of the run, shared by every command that writes.
+std::optional<int> png_level_option;
+
 void add_quality(CLI::App* command, int& quality) {
     command->add_option("--quality", quality, "JPEG quality of the written files, 1 to 100")
         ->check(CLI::Range(1, 100))
         ->capture_default_str();
+    command->add_option("--png-level", png_level_option,
+                        "zlib level 0..9 of written PNGs with adaptive filters (9 for the smallest file; "
+                        "default: a fast Paeth and run-length coding about as small as level 6)")
+        ->check(CLI::Range(0, 9));
 }
 
 void add_run_settings(CLI::App* command, RunSettings& run) {
@@ -97,7 +104,7 @@ int main(int argc, char** argv) {
 
     AdjustArgs adjust_args;
     CLI::App* adjust = app.add_subcommand(
-        "adjust", "Apply the slider adjustments, in the order brightness, contrast, saturation, warmth, sharpness");
+        "adjust", "Apply the slider adjustments, in the order brightness, contrast, warmth, saturation, sharpness");
     adjust->add_option("IN", adjust_args.input, "photo to read")->required();
     adjust->add_option("OUT", adjust_args.output, "photo to write")->required();
     const CLI::Validator slider = finite_in(-100.0, 100.0);
@@ -136,9 +143,9 @@ int main(int argc, char** argv) {
 
     GalleryArgs gallery_args;
     CLI::App* gallery = app.add_subcommand(
-        "gallery", "Draw every border style, flare type and gradient shape on a photo, as labelled contact sheets");
+        "gallery", "Draw every border style, flare type, gradient shape and legacy effect on a photo, as labelled contact sheets");
     gallery->add_option("OUTDIR", gallery_args.output_dir,
-                        "folder for the sheets borders, flares and gradients (created if missing)")
+                        "folder for the sheets borders, flares, gradients and legacy (created if missing)")
         ->required();
     gallery->add_option("--photo", gallery_args.photo,
                         "photo to draw on, .png, .jpg or .jpeg (default: build/photos/coffee.png, the demo's sample, "
@@ -170,6 +177,15 @@ int main(int argc, char** argv) {
                   "in the photo's pixels. Tools: " +
                   tool_kind_list() + ".");
 
+    LegacyArgs legacy_args;
+    CLI::App* legacy = app.add_subcommand("legacy", "Run one named effect of the legacy catalogue on a photo");
+    legacy->add_option("NAME", legacy_args.name, "the effect's name (see --list)");
+    legacy->add_option("IN", legacy_args.input, "photo to read");
+    legacy->add_option("OUT", legacy_args.output, "photo to write");
+    legacy->add_flag("--list", legacy_args.list, "list every name with what it does");
+    add_run_settings(legacy, legacy_args.run);
+    add_quality(legacy, legacy_args.quality);
+
     CLI::App* info = app.add_subcommand("info", "Show the library and document-format versions and the processors");
 
     try {
@@ -181,6 +197,7 @@ int main(int argc, char** argv) {
         return kUsageStatus;
     }
 
+    set_png_level(png_level_option);
     try {
         if (*apply) return run_apply(apply_args);
         if (*check) return run_check(check_effect);
@@ -190,6 +207,7 @@ int main(int argc, char** argv) {
         if (*info) return run_info();
         if (*gallery) return run_gallery(gallery_args);
         if (*paint) return run_paint(paint_args);
+        if (*legacy) return run_legacy(legacy_args);
     } catch (const UsageError& error) {
         std::fprintf(stderr, "vorlite: %s\n", error.what());
         return kUsageStatus;

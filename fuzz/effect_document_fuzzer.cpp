@@ -22,6 +22,7 @@ extern "C" int LLVMFuzzerTestOneInput(const uint8_t* data, size_t size) {
         VorEffectInitParams(&options);
         options.seed = size > 0 ? data[0] : 0;
         options.strength = size > 1 ? data[1] / 128.0 : 0.75;
+        options.bordersEnabled = size > 2 ? (data[2] & 1) : 1;
         VLPLRunEffect(document, &bitmap, &options);
         VorBitmapFree(&bitmap);
     }
