@@ -74,6 +74,12 @@ Image read_image(const std::filesystem::path& path);
 // given quality (1..100), by extension. Throws Failure naming the file.
 void write_image(const Image& image, const std::filesystem::path& path, int quality);
 
+// PNGs are written with the Paeth filter and run-length coding unless a
+// zlib level 0..9 is set, which writes them with libpng's adaptive filters
+// at that level (9 for the smallest files).
+void set_png_level(std::optional<int> level);
+std::optional<int> png_level();
+
 // Whole file contents; throws Failure naming the file.
 std::string read_file(const std::filesystem::path& path);
 

@@ -12,6 +12,7 @@
 #include <jerror.h>
 #include <libexif/exif-data.h>
 #include <png.h>
+#include <zlib.h>
 
 #include "image.h"
 
@@ -111,6 +112,15 @@ bool encode_png(const Image* image, std::FILE* file, bool opaque, PngErrors* err
                  opaque ? PNG_COLOR_TYPE_RGB : PNG_COLOR_TYPE_RGB_ALPHA, PNG_INTERLACE_NONE,
                  PNG_COMPRESSION_TYPE_DEFAULT, PNG_FILTER_TYPE_DEFAULT);
     png_set_sRGB_gAMA_and_cHRM(png, info, PNG_sRGB_INTENT_PERCEPTUAL);
+    if (const std::optional<int> level = png_level()) {
+        png_set_compression_level(png, *level);
+    } else {
+        // The Paeth predictor with run-length coding: on photographs as
+        // small as zlib's level 6 with adaptive filters, or within a tenth,
+        // at a fifth of the time.
+        png_set_filter(png, 0, PNG_FILTER_PAETH);
+        png_set_compression_strategy(png, Z_RLE);
+    }
     png_write_info(png, info);
     if (opaque) png_set_filler(png, 0, PNG_FILLER_AFTER);
     for (uint32_t y = 0; y < image->height; ++y) {
@@ -250,7 +260,14 @@ Image decode_jpeg_upright(const std::string& file, const std::filesystem::path& 
     return orient_upright(image, exif_orientation(file));
 }
 
+// The tool's one PNG setting, chosen once from its arguments.
+std::optional<int> png_level_choice;
+
 }  // namespace
+
+void set_png_level(std::optional<int> level) { png_level_choice = level; }
+
+std::optional<int> png_level() { return png_level_choice; }
 
 Image read_image(const std::filesystem::path& path) {
     if (require_format(path) == Format::png) {

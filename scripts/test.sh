@@ -7,6 +7,8 @@
 #   musl      the elementary-function checker built against musl: the pinned
 #             results whatever the C library
 #   sanitize  the suite under AddressSanitizer and UndefinedBehaviorSanitizer
+#   tsan      one loaded document on eight threads, and a batch of the tool
+#             on eight jobs, under ThreadSanitizer
 #   arm       the suite cross-built for 32-bit ARM hard-float, under qemu-arm
 #   install   cmake --install, then a CMake and a pkg-config consumer
 #   fuzz      the effect-document fuzzer for FUZZ_SECONDS (default 60)
@@ -16,7 +18,7 @@ cd "$(dirname "$0")/.."
 root=$PWD
 jobs=$(nproc 2>/dev/null || echo 2)
 stages=("$@")
-[ ${#stages[@]} -eq 0 ] && stages=(native fma-off musl sanitize arm install fuzz)
+[ ${#stages[@]} -eq 0 ] && stages=(native fma-off musl sanitize tsan arm install fuzz)
 
 "$root/scripts/setup.sh"
 
@@ -71,6 +73,15 @@ for stage in "${stages[@]}"; do
       banner "suite under AddressSanitizer and UndefinedBehaviorSanitizer"
       suite sanitize -DVORLITE_SANITIZE=address,undefined
       ;;
+    tsan)
+      banner "threads under ThreadSanitizer"
+      dir=$root/build/tsan
+      cmake -S "$root" -B "$dir" -DCMAKE_BUILD_TYPE=Release -DVORLITE_SANITIZE=thread >/dev/null
+      cmake --build "$dir" -j"$jobs" --target vorlite_thread_tests vorlite_cli_tests vorlite >/dev/null
+      export TSAN_OPTIONS=halt_on_error=1
+      "$dir/tests/vorlite_thread_tests"
+      "$dir/cli/tests/vorlite_cli_tests" --gtest_filter='*Batch*'
+      ;;
     arm)
       banner "suite on 32-bit ARM hard-float under qemu-arm"
       suite arm -DCMAKE_TOOLCHAIN_FILE="$root/cmake/arm-linux-gnueabihf.cmake"
@@ -84,7 +95,7 @@ for stage in "${stages[@]}"; do
       "$root/scripts/fuzz.sh" "${FUZZ_SECONDS:-60}"
       ;;
     *)
-      echo "test.sh: unknown stage '$stage' (native, fma-off, musl, sanitize, arm, install, fuzz)" >&2
+      echo "test.sh: unknown stage '$stage' (native, fma-off, musl, sanitize, tsan, arm, install, fuzz)" >&2
       exit 2
       ;;
   esac

@@ -99,15 +99,20 @@ TEST(CliImageFiles, ExtensionChoosesTheFormatInAnyCase) {
     for (const auto& [name, format] : cases) EXPECT_EQ(vorlite::cli::format_for_path(name), format) << name;
 }
 
-TEST_F(Vorlite, PngRoundTripKeepsEveryByteWithOrWithoutAlpha) {
-    for (bool opaque : {false, true}) {
-        const Image original = sample(13, 7, opaque);
-        vorlite::cli::write_image(original, file("round.png"), 90);
-        const Image back = vorlite::cli::read_image(file("round.png"));
-        ASSERT_EQ(back.width, 13u);
-        ASSERT_EQ(back.height, 7u);
-        EXPECT_EQ(back.rgba, original.rgba) << (opaque ? "opaque" : "with alpha");
+TEST_F(Vorlite, PngRoundTripKeepsEveryByteWithOrWithoutAlphaAtEveryLevel) {
+    const std::optional<int> levels[] = {std::nullopt, 0, 1, 6, 9};
+    for (const std::optional<int> level : levels) {
+        vorlite::cli::set_png_level(level);
+        for (bool opaque : {false, true}) {
+            const Image original = sample(13, 7, opaque);
+            vorlite::cli::write_image(original, file("round.png"), 90);
+            const Image back = vorlite::cli::read_image(file("round.png"));
+            ASSERT_EQ(back.width, 13u);
+            ASSERT_EQ(back.height, 7u);
+            EXPECT_EQ(back.rgba, original.rgba) << (opaque ? "opaque" : "with alpha") << " " << level.value_or(-1);
+        }
     }
+    vorlite::cli::set_png_level(std::nullopt);
 }
 
 TEST_F(Vorlite, JpegRoundTripStaysCloseAndComesBackOpaque) {
@@ -327,6 +332,21 @@ TEST_F(Vorlite, BatchGoesOnPastAnUnreadablePhotoAndExitsWith1) {
     EXPECT_NE(outcome.out.find("3 of 4 photos written"), std::string::npos) << outcome.out;
 }
 
+TEST_F(Vorlite, BatchOnEightThreadsWritesTheSerialBytes) {
+    fs::create_directories(file("in"));
+    for (int i = 0; i < 12; ++i) {
+        vorlite::cli::write_image(sample(40 + i, 30, true), file("in") / ("p" + std::to_string(i) + ".png"), 90);
+    }
+    const std::string look = std::string(VORLITE_EFFECTS_DIR) + "/warm-crisp-grain.json";
+    ASSERT_EQ(run("batch " + look + " " + file("in").string() + " " + file("serial").string() + " --jobs 1").status, 0);
+    ASSERT_EQ(run("batch " + look + " " + file("in").string() + " " + file("eight").string() + " --jobs 8").status, 0);
+    for (int i = 0; i < 12; ++i) {
+        const std::string name = "p" + std::to_string(i) + ".png";
+        EXPECT_EQ(vorlite::cli::read_image(file("eight") / name).rgba, vorlite::cli::read_image(file("serial") / name).rgba)
+            << name;
+    }
+}
+
 // ---- usage -------------------------------------------------------------
 
 TEST_F(Vorlite, UsageErrorsExitWith2OnOneLine) {
@@ -340,6 +360,7 @@ TEST_F(Vorlite, UsageErrorsExitWith2OnOneLine) {
         "apply " + effect + " " + in + " " + file("out.png").string() + " --strength nan",
         "apply " + effect + " " + in + " " + file("out.jpg").string() + " --quality 0",
         "apply " + effect + " " + in + " " + file("out.gif").string(),
+        "apply " + effect + " " + in + " " + file("out.png").string() + " --png-level 10",
         "adjust " + in + " " + file("out.png").string(),
         "adjust " + in + " " + file("out.png").string() + " --warmth 101",
         "auto " + in + " " + file("out.png").string() + " --enhance 4",
@@ -405,17 +426,18 @@ TEST_F(Vorlite, GalleryDrawsEveryFamilyAsALabelledSheet) {
     vorlite::cli::write_image(photo, file("photo.png"), 90);
     const Outcome outcome = run("gallery " + file("sheets").string() + " --photo " + file("photo.png").string());
     ASSERT_EQ(outcome.status, 0) << outcome.err;
-    EXPECT_EQ(lines(outcome.out), 3u) << outcome.out;
+    EXPECT_EQ(lines(outcome.out), 4u) << outcome.out;
 
     // 16 border styles (15 through VorBorders, the instant print); 19 flare
-    // types, the ring and the two presets; 3 gradient shapes. Every tile
-    // but the flare type that has no light differs from the photo.
+    // types, the ring and the two presets; 3 gradient shapes; the 38 legacy
+    // effects. Every tile but the flare type that has no light differs from
+    // the photo.
     struct Family {
         const char* sheet;
         std::size_t tiles;
         std::vector<std::size_t> unchanged;
     };
-    const Family families[] = {{"borders.png", 16, {}}, {"flares.png", 22, {8}}, {"gradients.png", 3, {}}};
+    const Family families[] = {{"borders.png", 16, {}}, {"flares.png", 22, {8}}, {"gradients.png", 3, {}}, {"legacy.png", 38, {}}};
     for (const Family& family : families) {
         const Image sheet = vorlite::cli::read_image(file("sheets") / family.sheet);
         const uint32_t rows = static_cast<uint32_t>((family.tiles + columns - 1) / columns);

@@ -27,7 +27,9 @@ TEST(MaskBrushes, FullWeightSetsOrClearsAlphaOnlyInsideTheOuterRadius) {
         EXPECT_NE(mask.at(15, 10, 3), mask.before[(10 * 21 + 15) * 4 + 3]) << "the soft edge";
         EXPECT_EQ(mask.at(16, 10, 3), mask.before[(10 * 21 + 16) * 4 + 3]) << "beyond 5.72";
         for (std::size_t i = 0; i < mask.bytes.size(); ++i) {
-            if (i % 4 != 3) ASSERT_EQ(mask.bytes[i], mask.before[i]) << "colour byte " << i;
+            if (i % 4 != 3) {
+                ASSERT_EQ(mask.bytes[i], mask.before[i]) << "colour byte " << i;
+            }
         }
     }
 }
@@ -96,8 +98,12 @@ TEST(MaskBrushes, DabsAtAndBeyondTheEdgesStayInside) {
         TestBitmap mask = mask_of(23, 12, 0);
         VorMaskDraw(mask.get(), &paint, c[0], c[1], 6.0, 1.0, 0);
         VorMaskSimilarColors(image.get(), mask.get(), &paint, c[0], c[1], 6.0, 10.0, 1.0, 1.0, 0, 1, 0);
-        if (c[0] == -3) EXPECT_GT(mask.at(0, 0, 3), 0);
-        if (c[0] == -100 || c[0] == 1e12) EXPECT_TRUE(mask.unchanged());
+        if (c[0] == -3) {
+            EXPECT_GT(mask.at(0, 0, 3), 0);
+        }
+        if (c[0] == -100 || c[0] == 1e12) {
+            EXPECT_TRUE(mask.unchanged());
+        }
     }
     VorBitmap empty{nullptr, 0, 0};
     VorMaskDraw(&empty, &paint, 0, 0, 3, 1, 0);

@@ -76,7 +76,9 @@ TEST(StrokeCurves, NoPositionsGiveNoArray) {
         VorPoint* points = reinterpret_cast<VorPoint*>(&points);
         uint32_t count = 99;
         VorInterpolateBetweenPointsWithBezierQuadCurve({0, 0}, {50, 0}, {50, 50}, radius, &points, &count, 0);
-        if (count == 0) EXPECT_EQ(points, nullptr) << radius;
+        if (count == 0) {
+            EXPECT_EQ(points, nullptr) << radius;
+        }
         std::free(points);
     }
     VorPoint* points = nullptr;
