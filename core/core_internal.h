@@ -113,6 +113,10 @@ constexpr std::uint8_t clamp_byte(int v) {
 using Curve = std::array<std::uint8_t, 256>;
 void apply_curve(VorBitmap* bitmap, const Curve& curve);
 
+// The per-channel byte lookups of a histogram map: the reference the
+// whole-pixel table path of VorBitmapHistogramTransform is held against.
+void histogram_transform_reference(VorBitmap* bitmap, const VorHistMap& map);
+
 // Double-precision elementary functions. They return the same bits on every
 // target (the C libraries' own differ in the last bit between x86-64 with
 // and without fused multiply-add and between C libraries); an exact path
