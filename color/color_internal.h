@@ -5,6 +5,7 @@
 #include <array>
 #include <cstddef>
 #include <cstdint>
+#include <optional>
 
 #include "core/core_internal.h"
 #include "zentra_vorlite.h"
@@ -59,6 +60,29 @@ private:
     float opacity_;
     std::array<bool, 256> filled_{};
     core::WorkingArray<std::uint8_t> entries_;
+};
+
+// Compositing: VorBitmapBlendBitmap split into its preparation, made once,
+// and rows blended after it, each row giving the bytes the whole-bitmap
+// call gives. For a caller that finishes a picture row by row and never
+// holds a second copy of it. `pixels` is the size of the whole job, which
+// decides whether a channel-pair table pays.
+class RowBlender {
+public:
+    RowBlender(std::uint32_t mode, float opacity, std::size_t pixels);
+    RowBlender(const RowBlender&) = delete;
+    RowBlender& operator=(const RowBlender&) = delete;
+
+    // Blends `width` source pixels over as many destination pixels; the
+    // destination keeps its alpha.
+    void blend(std::uint8_t* dst, const std::uint8_t* src, std::uint32_t width) const;
+
+private:
+    std::uint32_t mode_;
+    float opacity_;
+    const std::uint8_t* table_ = nullptr;  // null: blend pixel by pixel
+    int mean_weight_ = -1;                 // the table as a weighted mean, or -1
+    std::optional<ChannelPairTable> pairs_;
 };
 
 // Blend modes: the luminance of a colour on the 0..255 scale, from the

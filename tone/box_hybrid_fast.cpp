@@ -290,7 +290,7 @@ bool box_hybrid_pass_fast(VorBitmap* bitmap, const BoxHybridShape& shape, bool c
     return true;
 }
 
-TwoPasses box_hybrid_two_passes(VorBitmap* bitmap, float amount, FinishRow finish) {
+TwoPasses box_hybrid_two_passes(VorBitmap* bitmap, float amount, const FinishRow& finish) {
     BoxHybridShape shape;
     if (!box_hybrid_shape(bitmap->width, bitmap->height, amount, &shape)) return TwoPasses::unavailable;
     if (bitmap->width == 0 || bitmap->height == 0) return TwoPasses::unavailable;
@@ -322,7 +322,7 @@ namespace vorlite::tone {
 // Without vector lanes every pass takes the reference form.
 bool box_hybrid_pass_fast(VorBitmap*, const BoxHybridShape&, bool) { return false; }
 
-TwoPasses box_hybrid_two_passes(VorBitmap*, float, FinishRow) { return TwoPasses::unavailable; }
+TwoPasses box_hybrid_two_passes(VorBitmap*, float, const FinishRow&) { return TwoPasses::unavailable; }
 
 }  // namespace vorlite::tone
 #endif

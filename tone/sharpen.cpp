@@ -3,6 +3,7 @@
 // the light anti-aliasing blur and the "sharpness" processor.
 #include <cstring>
 
+#include "color/color_internal.h"
 #include "core/core_internal.h"
 #include "proclist/proclist_internal.h"
 #include "tone/tone_internal.h"
@@ -50,6 +51,19 @@ VOR_API void VorConvolutionProcessorKipSharpen(VorBitmap* bitmap, float amount) 
 VOR_API void VorConvolutionProcessorSharpenAndBlendWithOriginal(VorBitmap* bitmap, float amount,
                                                                 float alpha, uint32_t mode) {
     if (amount == 0.0f || alpha == 0.0f) return;
+    // Streamed, each row is blended over its original while that is still
+    // at hand, so no sharpened copy of the whole picture is ever made.
+    const vorlite::color::RowBlender blender(mode, alpha, vorlite::core::pixel_count(*bitmap));
+    const auto blend_row = [&blender](std::uint8_t* row, std::uint8_t* sharpened_row, std::uint32_t width) {
+        blender.blend(row, sharpened_row, width);
+    };
+    switch (vorlite::tone::box_hybrid_two_passes(bitmap, amount, blend_row)) {
+        case vorlite::tone::TwoPasses::done:
+        case vorlite::tone::TwoPasses::out_of_memory:
+            return;
+        case vorlite::tone::TwoPasses::unavailable:
+            break;
+    }
     vorlite::core::WorkingBitmap sharpened;
     if (!sharpened.build_copy(*bitmap)) return;
     VorConvolutionEffectBoxHybridSharpen(sharpened.get(), amount);

@@ -5,6 +5,7 @@
 #include <array>
 #include <cstddef>
 #include <cstdint>
+#include <functional>
 
 #include "core/core_internal.h"
 #include "zentra_vorlite.h"
@@ -82,8 +83,8 @@ bool box_hybrid_pass_fast(VorBitmap* bitmap, const BoxHybridShape& shape, bool c
 // Unavailable when the passes would not touch the bitmap or the kernel
 // suits only the reference form: the caller then runs the passes itself.
 enum class TwoPasses { done, unavailable, out_of_memory };
-using FinishRow = void (*)(std::uint8_t* row, std::uint8_t* filtered, std::uint32_t width);
-TwoPasses box_hybrid_two_passes(VorBitmap* bitmap, float amount, FinishRow finish);
+using FinishRow = std::function<void(std::uint8_t* row, std::uint8_t* filtered, std::uint32_t width)>;
+TwoPasses box_hybrid_two_passes(VorBitmap* bitmap, float amount, const FinishRow& finish);
 
 // Intensity map: VorBitmapIntensityMap one pixel at a time, each pixel's
 // mapped colour blended with VorColorBlend. The table and colour-mode

@@ -187,6 +187,33 @@ TEST(SharpenEntryPoints, AllRunTheSameTwoPasses) {
     EXPECT_EQ(antialiased.bytes, light_blur.bytes);
 }
 
+TEST(SharpenAndBlend, RowsBlendedAsTheyFinishGiveTheWholeCopysBlend) {
+    // The sharpened picture never exists whole: each row is blended over
+    // its original as the passes finish it. It must give the bytes of
+    // filtering a full copy and blending that back, in every mode, on
+    // pictures small enough for per-pixel blends and large enough for the
+    // channel-pair table and its weighted-mean form.
+    const struct {
+        uint32_t mode;
+        float opacity;
+    } blends[] = {{VOR_BLEND_NORMAL, 0.5f}, {VOR_BLEND_NORMAL, 0.37f}, {VOR_BLEND_MULTIPLY, 0.8f},
+                  {VOR_BLEND_OVERLAY, 1.0f}, {VOR_BLEND_COLOR, 0.6f}, {VOR_BLEND_SCREEN, -0.5f}};
+    const std::pair<uint32_t, uint32_t> sizes[] = {{61, 47}, {331, 227}};
+    for (const auto& [w, h] : sizes) {
+        const Image original(w, h);
+        for (const auto& b : blends) {
+            for (const float amount : {150.0f, -80.0f}) {
+                Image sharpened = original, expected = original, image = original;
+                vorlite::tone::box_hybrid_pass_reference(&sharpened.bitmap, amount, false);
+                vorlite::tone::box_hybrid_pass_reference(&sharpened.bitmap, amount, true);
+                VorBitmapBlendBitmap(&expected.bitmap, &sharpened.bitmap, b.mode, b.opacity);
+                VorConvolutionProcessorSharpenAndBlendWithOriginal(&image.bitmap, amount, b.opacity, b.mode);
+                EXPECT_EQ(image.bytes, expected.bytes) << w << "x" << h << " mode " << b.mode << " at " << b.opacity;
+            }
+        }
+    }
+}
+
 TEST(SoftFocus, HalfTheBlurPlusSixTenthsOfTheOriginal) {
     const Image original(1203, 7);  // five boxes of 3 pixels, reaching past every row
     Image image = original, blurred = original;
