@@ -34,6 +34,13 @@ VorColor faded(VorColor c, float opacity) {
     return c;
 }
 
+// Two read-out fields two spaces apart, as a camera's screen sets them.
+std::string two_fields(const char* first, const char* second) {
+    char text[64];
+    std::snprintf(text, sizeof text, "%s  %s", first, second);
+    return text;
+}
+
 // Text with a soft shadow below and to the right, legible on any photo.
 void shadowed_text(VorBitmap* b, const std::string& text, float x, float y, float pitch, VorColor colour) {
     const VorColor shadow = faded(k_shadow, static_cast<float>(colour.a) / 255.0f);
@@ -262,15 +269,15 @@ VOR_API void VorCameraDisplay7Legacy(VorBitmap* bitmap, uint32_t seed) {
     static constexpr const char* k_balance[] = {"AWB", "*", "~"};
     const float pitch = 0.5f * u;
     const float margin = 4.0f * u;
-    const std::string mode = std::string(k_modes[pick(&rng, 4)]) + "  " + k_balance[pick(&rng, 3)];
+    const std::string mode = two_fields(k_modes[pick(&rng, 4)], k_balance[pick(&rng, 3)]);
     shadowed_text(bitmap, mode, margin, margin, pitch, k_white);
     battery(bitmap, w - margin - 7.7f * u, margin, u, 1 + pick(&rng, 3), k_white);
     const VorColor lamp{255, 170, 60, 255};
     VorRingFlare(bitmap, w - margin - 12.0f * u, margin + 1.6f * u, 1.3f * u, &lamp, VOR_BLEND_SCREEN);
-    const std::string shots = "[" + std::to_string(8 + pick(&rng, 400)) + "]";
+    const std::string shots = std::to_string(8 + pick(&rng, 400));
     static constexpr const char* k_speeds[] = {"1/30", "1/60", "1/125", "1/250"};
     static constexpr const char* k_apertures[] = {"f2.8", "f4.0", "f5.6", "f8.0"};
-    const std::string exposure = std::string(k_speeds[pick(&rng, 4)]) + "  " + k_apertures[pick(&rng, 4)];
+    const std::string exposure = two_fields(k_speeds[pick(&rng, 4)], k_apertures[pick(&rng, 4)]);
     const float bottom = h - margin - 7.0f * pitch;
     shadowed_text(bitmap, exposure, margin, bottom, pitch, k_white);
     shadowed_text(bitmap, shots, w - margin - text_width(shots.size(), pitch), bottom, pitch, k_white);

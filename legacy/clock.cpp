@@ -1,4 +1,5 @@
 // The local date, behind one function so that tests can fix it.
+#include <cstdio>
 #include <ctime>
 
 #include "legacy/legacy_internal.h"
@@ -29,10 +30,8 @@ std::string date_text(const LocalDate& date) {
     const int month = date.month >= 1 && date.month <= 12 ? date.month : 1;
     const int day = date.day >= 1 && date.day <= 31 ? date.day : 1;
     const int year = date.year >= 0 && date.year <= 9999 ? date.year : 1970;
-    std::string text = std::string(k_days[weekday]) + " " + k_months[month - 1] + " ";
-    text += static_cast<char>('0' + day / 10);
-    text += static_cast<char>('0' + day % 10);
-    text += " " + std::to_string(year);
+    char text[32];
+    std::snprintf(text, sizeof text, "%s %s %02d %d", k_days[weekday], k_months[month - 1], day, year);
     return text;
 }
 

