@@ -7,6 +7,8 @@
 //   --peak-rss-kb=N      the tool's peak resident memory
 //   --bitmap-bytes=N     size of the decoded bitmap it worked on
 //   --memory-note=TEXT   why memory was not measured, or how it was
+//   --append=FILE        a section written elsewhere (the command-line tool's
+//                        timings), added at the end as it stands
 //   --out=FILE           where to write (default: standard output)
 #include <cstdio>
 #include <cstdlib>
@@ -54,13 +56,14 @@ bool load(const std::string& path, vorlite::bench::report::Run& run) {
 
 int main(int argc, char** argv) {
     vorlite::bench::report::Inputs inputs;
-    std::string single, multi, cold, out, peak, bitmap;
+    std::string single, multi, cold, out, peak, bitmap, append;
     for (int i = 1; i < argc; ++i) {
         if (!take(argv[i], "--single=", single) && !take(argv[i], "--multi=", multi) &&
             !take(argv[i], "--cold=", cold) &&
             !take(argv[i], "--machine=", inputs.machine) && !take(argv[i], "--date=", inputs.date) &&
             !take(argv[i], "--peak-rss-kb=", peak) && !take(argv[i], "--bitmap-bytes=", bitmap) &&
-            !take(argv[i], "--memory-note=", inputs.memory.note) && !take(argv[i], "--out=", out)) {
+            !take(argv[i], "--memory-note=", inputs.memory.note) && !take(argv[i], "--out=", out) &&
+            !take(argv[i], "--append=", append)) {
             std::fprintf(stderr, "vorlite_bench_report: unknown argument '%s'\n", argv[i]);
             return 2;
         }
@@ -78,7 +81,15 @@ int main(int argc, char** argv) {
         inputs.memory.peak_bytes = std::strtod(peak.c_str(), nullptr) * 1024.0;
         inputs.memory.bitmap_bytes = std::strtod(bitmap.c_str(), nullptr);
     }
-    const std::string text = vorlite::bench::report::render(inputs);
+    std::string text = vorlite::bench::report::render(inputs);
+    if (!append.empty()) {
+        std::string section;
+        if (!read_file(append, section)) {
+            std::fprintf(stderr, "vorlite_bench_report: cannot read '%s'\n", append.c_str());
+            return 1;
+        }
+        text += "\n" + section;
+    }
     if (out.empty()) {
         std::cout << text;
         return 0;
