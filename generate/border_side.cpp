@@ -11,6 +11,7 @@
 #include <cmath>
 #include <cstdint>
 
+#include "color/color_internal.h"
 #include "core/core_internal.h"
 #include "generate/generate_internal.h"
 
@@ -188,11 +189,38 @@ void lay(std::uint8_t* p, const VorColor& colour, std::uint32_t mode, float opac
 
 // Visits the pixels within `reach` of an edge, row by row; `cover` gives
 // each one's coverage.
+// Most of a band is covered fully: one colour at one opacity, where each
+// channel's result depends on its own level alone, so three tables give
+// the blend's bytes. The colour mode mixes channels and has none.
+class FullCover {
+public:
+    FullCover(const VorColor& colour, std::uint32_t mode, float opacity) {
+        tabled_ = vorlite::color::blend_channel_row(mode, colour.r, opacity, red_);
+        if (!tabled_) return;
+        vorlite::color::blend_channel_row(mode, colour.g, opacity, green_);
+        vorlite::color::blend_channel_row(mode, colour.b, opacity, blue_);
+    }
+
+    bool tabled() const { return tabled_; }
+    void lay(std::uint8_t* p) const {
+        p[0] = red_[p[0]];
+        p[1] = green_[p[1]];
+        p[2] = blue_[p[2]];
+    }
+
+private:
+    bool tabled_ = false;
+    std::uint8_t red_[256];
+    std::uint8_t green_[256];
+    std::uint8_t blue_[256];
+};
+
 template <typename Cover>
 void paint_edges(VorBitmap* bitmap, const VorColor& colour, std::uint32_t mode, float reach, Cover cover) {
     const std::uint32_t width = bitmap->width;
     const std::uint32_t height = bitmap->height;
     const float opacity = static_cast<float>(colour.a) * vorlite::core::k_inv255;
+    const FullCover full(colour, mode, opacity);
     const auto margin = static_cast<std::uint32_t>(std::min(reach, static_cast<float>(std::max(width, height))));
     for (std::uint32_t y = 0; y < height; ++y) {
         const bool near_row = y < margin || height - 1 - y < margin;
@@ -203,7 +231,11 @@ void paint_edges(VorBitmap* bitmap, const VorColor& colour, std::uint32_t mode, 
                 continue;
             }
             const float c = cover(x, y);
-            if (c > 0.0f) lay(row + std::size_t{x} * 4, colour, mode, opacity * c);
+            if (c == 1.0f && full.tabled()) {
+                full.lay(row + std::size_t{x} * 4);
+            } else if (c > 0.0f) {
+                lay(row + std::size_t{x} * 4, colour, mode, opacity * c);
+            }
         }
     }
 }
