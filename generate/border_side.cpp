@@ -281,15 +281,19 @@ VOR_API void VorBordersDoubleSided(VorBitmap* bitmap, const VorBorderParams* par
     const float depth = std::min(tuning(params->width, 0.0f, 1.0f, 0.0f) * sum, 0.45f * shorter);
     const float amplitude = std::min(tuning(params->sideTune1, 0.0f, 1.0f, 0.0f) * sum, 0.25f * shorter);
     const std::uint32_t last = length - 1;
+    const float reach = depth + amplitude * 2.0f + 2.0f;
     // A strip torn on both sides: its outer edge wanders just inside the
     // picture's edge, its inner edge about the band's depth; between the
-    // two it covers fully, with a pixel of ramp at each tear.
+    // two it covers fully, with a pixel of ramp at each tear. An edge
+    // farther than the strip can reach adds nothing, so most pixels weigh
+    // one edge, not four.
     const auto cover = [&](std::uint32_t x, std::uint32_t y) {
         const float d[4] = {static_cast<float>(y), static_cast<float>(height - 1 - y), static_cast<float>(x),
                             static_cast<float>(width - 1 - x)};
         const std::uint32_t along[4] = {x, last - x, y, last - y};
         float best = 0.0f;
         for (int e = 0; e < 4; ++e) {
+            if (d[e] >= reach) continue;
             const float from = 0.5f * amplitude * std::fabs(outer[along[e]]);
             const float to = depth + amplitude * inner[along[e]];
             const float c = std::min(std::clamp(d[e] - from + 0.5f, 0.0f, 1.0f), std::clamp(to - d[e] + 0.5f, 0.0f, 1.0f));
@@ -297,8 +301,7 @@ VOR_API void VorBordersDoubleSided(VorBitmap* bitmap, const VorBorderParams* par
         }
         return best;
     };
-    paint_edges(bitmap, params->color, static_cast<std::uint32_t>(params->blendMode), depth + amplitude * 2.0f + 2.0f,
-                cover);
+    paint_edges(bitmap, params->color, static_cast<std::uint32_t>(params->blendMode), reach, cover);
 }
 
 }  // extern "C"
