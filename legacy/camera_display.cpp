@@ -177,8 +177,14 @@ VOR_API void VorCameraDisplay4Legacy(VorBitmap* bitmap, uint32_t seed, double st
     static constexpr const char* k_speeds[] = {"1/60s", "1/125s", "1/250s", "1/500s", "1/1000s"};
     static constexpr const char* k_isos[] = {"ISO100", "ISO200", "ISO400", "ISO800"};
     static constexpr const char* k_compensation[] = {"-0.7", "-0.3", "+0.0", "+0.3", "+0.7"};
-    const std::string readout = std::string(k_apertures[pick(&rng, 6)]) + "  " + k_speeds[pick(&rng, 5)] + "  " +
-                                k_isos[pick(&rng, 4)] + "  " + k_compensation[pick(&rng, 5)];
+    // One draw per statement: the operands of + and of a call may be
+    // evaluated in any order, and the ARM compiler picks another one.
+    const char* aperture = k_apertures[pick(&rng, 6)];
+    const char* speed = k_speeds[pick(&rng, 5)];
+    const char* iso = k_isos[pick(&rng, 4)];
+    const char* compensation = k_compensation[pick(&rng, 5)];
+    const std::string readout =
+        std::string(aperture) + "  " + speed + "  " + iso + "  " + compensation;
     const float u = unit_of(*bitmap);
     const float w = width_of(*bitmap), h = height_of(*bitmap);
     const VorColor green = faded(k_green, opacity);
@@ -216,8 +222,12 @@ VOR_API void VorCameraDisplay5Legacy(VorBitmap* bitmap, uint32_t seed) {
     VorRNGSeed(&rng, seed);
     const std::string place = k_places[pick(&rng, 20)];
     char coordinates[48];
-    std::snprintf(coordinates, sizeof coordinates, "N %u.%02u  W %u.%02u", 50 + pick(&rng, 8), pick(&rng, 100),
-                  pick(&rng, 6), pick(&rng, 100));
+    const std::uint32_t north = 50 + pick(&rng, 8);
+    const std::uint32_t north_hundredths = pick(&rng, 100);
+    const std::uint32_t west = pick(&rng, 6);
+    const std::uint32_t west_hundredths = pick(&rng, 100);
+    std::snprintf(coordinates, sizeof coordinates, "N %u.%02u  W %u.%02u", north, north_hundredths, west,
+                  west_hundredths);
     const std::string height = "ALT " + std::to_string(20 + pick(&rng, 900)) + "M";
     const float u = unit_of(*bitmap);
     const float h = height_of(*bitmap);
@@ -269,7 +279,8 @@ VOR_API void VorCameraDisplay7Legacy(VorBitmap* bitmap, uint32_t seed) {
     static constexpr const char* k_balance[] = {"AWB", "*", "~"};
     const float pitch = 0.5f * u;
     const float margin = 4.0f * u;
-    const std::string mode = two_fields(k_modes[pick(&rng, 4)], k_balance[pick(&rng, 3)]);
+    const char* exposure_mode = k_modes[pick(&rng, 4)];
+    const std::string mode = two_fields(exposure_mode, k_balance[pick(&rng, 3)]);
     shadowed_text(bitmap, mode, margin, margin, pitch, k_white);
     battery(bitmap, w - margin - 7.7f * u, margin, u, 1 + pick(&rng, 3), k_white);
     const VorColor lamp{255, 170, 60, 255};
@@ -277,7 +288,8 @@ VOR_API void VorCameraDisplay7Legacy(VorBitmap* bitmap, uint32_t seed) {
     const std::string shots = std::to_string(8 + pick(&rng, 400));
     static constexpr const char* k_speeds[] = {"1/30", "1/60", "1/125", "1/250"};
     static constexpr const char* k_apertures[] = {"f2.8", "f4.0", "f5.6", "f8.0"};
-    const std::string exposure = two_fields(k_speeds[pick(&rng, 4)], k_apertures[pick(&rng, 4)]);
+    const char* speed = k_speeds[pick(&rng, 4)];
+    const std::string exposure = two_fields(speed, k_apertures[pick(&rng, 4)]);
     const float bottom = h - margin - 7.0f * pitch;
     shadowed_text(bitmap, exposure, margin, bottom, pitch, k_white);
     shadowed_text(bitmap, shots, w - margin - text_width(shots.size(), pitch), bottom, pitch, k_white);
