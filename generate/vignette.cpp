@@ -1,6 +1,8 @@
 // The vignette (border style 15): the colour laid over the picture with a
 // smooth ramp from a clear centre to full strength beyond the radius; and
 // the "vignette" processor.
+#include <algorithm>
+
 #include "core/core_internal.h"
 #include "core/simd.h"
 #include "generate/generate_internal.h"
@@ -111,18 +113,17 @@ struct Vignette {
     // picture's proportions). The column's share is formed once per column
     // and the row's once a row; a pixel adds them in the same order.
     template <bool Stretch, std::int32_t Mode>
-    void row_codes(std::uint32_t y, const float* column_share, const std::int64_t* column_square,
-                   std::uint16_t* codes, bool lanes) const {
+    void span_codes(std::uint32_t y, std::uint32_t x, std::uint32_t end, const float* column_share,
+                    const std::int64_t* column_square, std::uint16_t* codes, bool lanes) const {
         const std::uint32_t width = bitmap->width;
         const std::int64_t ey = static_cast<std::int64_t>(y) - cy;
         const std::int64_t ey2 = ey * ey;
         const float row_share = static_cast<float>(ey2) * ih;
-        std::uint32_t x = 0;
 #if VORLITE_EXACT_FLOAT_LANES
         // Without the stretch the pixel's squared distance is converted as a
         // whole: 32-bit lanes hold it exactly while it stays below 2^31.
         if (lanes && (Stretch || column_square[width] + ey2 < (std::int64_t{1} << 31))) {
-            for (; x + 4 <= width; x += 4) {
+            for (; x + 4 <= end; x += 4) {
                 simd::f32x4 distance;
                 if constexpr (Stretch) {
                     distance = (simd::load<simd::f32x4>(column_share + x) + simd::splat(row_share)) * simd::splat(k);
@@ -141,11 +142,31 @@ struct Vignette {
 #else
         (void)lanes;
 #endif
-        for (; x < width; ++x) {
+        for (; x < end; ++x) {
             const float distance = Stretch ? (column_share[x] + row_share) * k
                                            : static_cast<float>(column_square[x] + ey2) * k;
             codes[x] = code_of<Mode>(distance, colour.a);
         }
+    }
+
+    // A column and its mirror about the centre lie at the same distance
+    // too: the half right of the centre is classified, the half left of it
+    // copies, and only columns whose mirror falls outside are computed.
+    template <bool Stretch, std::int32_t Mode>
+    void row_codes(std::uint32_t y, const float* column_share, const std::int64_t* column_square,
+                   std::uint16_t* codes, bool lanes) const {
+        const std::int64_t width = bitmap->width;
+        if (!lanes) {
+            span_codes<Stretch, Mode>(y, 0, static_cast<std::uint32_t>(width), column_share, column_square, codes,
+                                      false);
+            return;
+        }
+        const auto middle = static_cast<std::uint32_t>(std::clamp<std::int64_t>(cx, 0, width));
+        const auto mirrored = static_cast<std::uint32_t>(std::clamp<std::int64_t>(2 * cx - width + 1, 0, middle));
+        span_codes<Stretch, Mode>(y, middle, static_cast<std::uint32_t>(width), column_share, column_square, codes,
+                                  lanes);
+        span_codes<Stretch, Mode>(y, 0, mirrored, column_share, column_square, codes, lanes);
+        for (std::uint32_t x = mirrored; x < middle; ++x) codes[x] = codes[2 * cx - x];
     }
 
     template <bool Stretch, std::int32_t Mode>

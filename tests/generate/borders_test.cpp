@@ -187,7 +187,8 @@ TEST(VignetteProcessor, DrawsOrRefusesWithoutTouching) {
 
 }  // namespace
 
-// Rows classified four pixels at a time store what the pixel-by-pixel
+// Rows classified four pixels at a time, the half left of the centre
+// copied from the half right of it, store what the pixel-by-pixel
 // reference stores: every shape mode, stretched or not, centres moved off
 // the picture, a radius that puts most pixels on the ramp or beyond it,
 // and the colour mode's direct blend beyond the ramp.

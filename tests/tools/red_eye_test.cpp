@@ -68,4 +68,17 @@ TEST(Whiten, YellowedWhiteBrightensAndNeutralisesWhileOtherHuesStay) {
     EXPECT_EQ(rgba(leaf.pixel(0)), rgba(round_trip));
 }
 
+// Pixels are whitened in blocks: every pixel of a bitmap whose size is
+// not a whole number of blocks comes out as it does alone.
+TEST(Whiten, EveryPixelOfABitmapAsOnItsOwn) {
+    TestBitmap image(131, 3, 7u);
+    const TestBitmap original(image);
+    VorWhiten(image.get(), image.get());
+    for (std::size_t i = 0; i < std::size_t{image.width} * image.height; ++i) {
+        TestBitmap alone(1, 1, original.pixel(i));
+        VorWhiten(alone.get(), nullptr);
+        ASSERT_EQ(rgba(image.pixel(i)), rgba(alone.pixel(0))) << i;
+    }
+}
+
 }  // namespace
