@@ -13,6 +13,7 @@
 
 #include "color/color_internal.h"
 #include "core/core_internal.h"
+#include "core/simd.h"
 #include "generate/generate_internal.h"
 
 namespace {
@@ -42,14 +43,6 @@ void fill_profile(float* profile, std::uint32_t length, float roughness, std::in
     const std::uint32_t seed = VorRNGNextInt(rng);
     VorMPDSeed(profile, 0, static_cast<std::int32_t>(length - 1), 1.0f, roughness, mode, seed);
 }
-
-// Where a pixel lies relative to the four edges: its distance from each
-// and its position along each (so that opposite edges read their profile
-// in opposite directions and no two edges share a stretch of it).
-struct EdgePlace {
-    float depth;     // distance from the edge, pixels
-    std::uint32_t along;
-};
 
 // The band's shape: how deep it reaches at a place along an edge, and how
 // soft its inner boundary is there.
@@ -84,31 +77,48 @@ public:
     // The deepest the band can reach, so rows and columns beyond it are skipped.
     float reach() const { return depth_ + amplitude_ + 2.0f * softness_ + fringe_ * depth_ + 2.0f; }
 
+    // How deep the band reaches at every place along each edge, and the
+    // softness of the wet plate's streaks there: formed once for the pass,
+    // since a pixel asks for four of them.
+    bool build() {
+        const std::uint32_t last = profiles_.length - 1;
+        for (int e = 0; e < 4; ++e) {
+            const bool horizontal = e < 2;
+            const std::uint32_t n = horizontal ? width_ : height_;
+            if (!reach_[e].build(n) || !soft_[e].build(n)) return false;
+            for (std::uint32_t i = 0; i < n; ++i) {
+                // Top and left read their profile forward, bottom and right
+                // backward, so no two edges share a stretch of it.
+                const std::uint32_t along = e % 2 == 0 ? i : last - i;
+                const float t = static_cast<float>(i) / static_cast<float>(n);
+                const float n1 = (horizontal ? profiles_.first : profiles_.second)[along];
+                const float n2 = (horizontal ? profiles_.second : profiles_.first)[along];
+                reach_[e][i] = depth_at(t, n1);
+                // Streaks: the softness itself wanders along the edge.
+                soft_[e][i] = style_ == VOR_BORDER_GLIMMO ? softness_ * (0.4f + streaks_ * std::fabs(n2) * 1.5f) + 1.0f
+                                                          : softness_;
+            }
+        }
+        if (style_ == VOR_BORDER_BULGE || style_ == VOR_BORDER_GLIMMO) {
+            // The ease at the two ends of the ramp, where most pixels lie.
+            eased_empty_ = 0.5f - 0.5f * vorlite::core::cosf(k_pi * 0.0f);
+            eased_full_ = 0.5f - 0.5f * vorlite::core::cosf(k_pi * 1.0f);
+        }
+        return true;
+    }
+
     // Coverage 0..1 of the colour at a pixel.
     float coverage(std::uint32_t x, std::uint32_t y) const {
-        const std::uint32_t last = profiles_.length - 1;
-        const EdgePlace edges[4] = {
-            {static_cast<float>(y), x},                           // top
-            {static_cast<float>(height_ - 1 - y), last - x},      // bottom
-            {static_cast<float>(x), y},                           // left
-            {static_cast<float>(width_ - 1 - x), last - y},       // right
-        };
+        const float depth[4] = {static_cast<float>(y), static_cast<float>(height_ - 1 - y), static_cast<float>(x),
+                                static_cast<float>(width_ - 1 - x)};
+        const std::uint32_t place[4] = {x, x, y, y};
         float inside = -1e30f;  // how far into the band, pixels
         float soft = softness_;
         for (int e = 0; e < 4; ++e) {
-            const bool horizontal = e < 2;
-            const std::uint32_t along = edges[e].along;
-            const float t = static_cast<float>(horizontal ? x : y) / static_cast<float>(horizontal ? width_ : height_);
-            const float n1 = (horizontal ? profiles_.first : profiles_.second)[along];
-            const float n2 = (horizontal ? profiles_.second : profiles_.first)[along];
-            const float reach_here = depth_at(t, n1);
-            const float into = reach_here - edges[e].depth;
+            const float into = reach_[e][place[e]] - depth[e];
             if (into > inside) {
                 inside = into;
-                if (style_ == VOR_BORDER_GLIMMO) {
-                    // Streaks: the softness itself wanders along the edge.
-                    soft = softness_ * (0.4f + streaks_ * std::fabs(n2) * 1.5f) + 1.0f;
-                }
+                soft = soft_[e][place[e]];
             }
         }
         if (corner_ > 0.0f) inside = std::max(inside, rounded_corner(x, y));
@@ -158,7 +168,9 @@ private:
             case VOR_BORDER_BULGE:
             case VOR_BORDER_GLIMMO: {
                 const float u = std::clamp(inside / soft + 0.5f, 0.0f, 1.0f);
-                const float eased = 0.5f - 0.5f * vorlite::core::cosf(k_pi * u);
+                const float eased = u == 0.0f   ? eased_empty_
+                                    : u == 1.0f ? eased_full_
+                                                : 0.5f - 0.5f * vorlite::core::cosf(k_pi * u);
                 // The wet-plate edge darkens more steeply than it fades.
                 return style_ == VOR_BORDER_GLIMMO ? std::sqrt(eased) : eased;
             }
@@ -179,6 +191,10 @@ private:
     float fringe_power_ = 1.5f;
     float streaks_ = 1.0f;
     float corner_ = 0.0f;
+    float eased_empty_ = 0.0f;
+    float eased_full_ = 1.0f;
+    vorlite::core::WorkingArray<float> reach_[4];
+    vorlite::core::WorkingArray<float> soft_[4];
 };
 
 void lay(std::uint8_t* p, const VorColor& colour, std::uint32_t mode, float opacity) {
@@ -240,7 +256,227 @@ void paint_edges(VorBitmap* bitmap, const VorColor& colour, std::uint32_t mode, 
     }
 }
 
+// A strip torn on both sides: its outer edge wanders just inside the
+// picture's edge, its inner edge about the band's depth; between the two
+// it covers fully, with a pixel of ramp at each tear. An edge farther than
+// the strip can reach adds nothing, so most pixels weigh one edge, not four.
+class Strip {
+public:
+    Strip(const VorBorderParams& p, std::uint32_t width, std::uint32_t height)
+        : width_(width), height_(height), last_(std::max(width, height) - 1) {
+        const auto sum = static_cast<float>(static_cast<std::uint64_t>(width) + height);
+        const float shorter = static_cast<float>(std::min(width, height));
+        depth_ = std::min(tuning(p.width, 0.0f, 1.0f, 0.0f) * sum, 0.45f * shorter);
+        amplitude_ = std::min(tuning(p.sideTune1, 0.0f, 1.0f, 0.0f) * sum, 0.25f * shorter);
+        reach_ = depth_ + amplitude_ * 2.0f + 2.0f;
+    }
+
+    float reach() const { return reach_; }
+    // Where the strip starts and where it ends, at a place along an edge.
+    float from(const float* outer, std::uint32_t along) const { return 0.5f * amplitude_ * std::fabs(outer[along]); }
+    float to(const float* inner, std::uint32_t along) const { return depth_ + amplitude_ * inner[along]; }
+
+    // The reference: one pixel's coverage, every edge weighed in turn.
+    float coverage(const float* inner, const float* outer, std::uint32_t x, std::uint32_t y) const {
+        const float d[4] = {static_cast<float>(y), static_cast<float>(height_ - 1 - y), static_cast<float>(x),
+                            static_cast<float>(width_ - 1 - x)};
+        const std::uint32_t along[4] = {x, last_ - x, y, last_ - y};
+        float best = 0.0f;
+        for (int e = 0; e < 4; ++e) {
+            if (d[e] >= reach_) continue;
+            best = std::max(best, edge_coverage(d[e], from(outer, along[e]), to(inner, along[e])));
+        }
+        return best;
+    }
+
+    static float edge_coverage(float d, float from, float to) {
+        return std::min(std::clamp(d - from + 0.5f, 0.0f, 1.0f), std::clamp(to - d + 0.5f, 0.0f, 1.0f));
+    }
+
+private:
+    std::uint32_t width_;
+    std::uint32_t height_;
+    std::uint32_t last_;
+    float depth_ = 0.0f;
+    float amplitude_ = 0.0f;
+    float reach_ = 0.0f;
+};
+
+// The strip row by row: the top and bottom tears of every column are
+// formed once for the pass, a row's coverage is formed before it is laid
+// (along the top and bottom rows four columns at a time), and the left and
+// right tears join only the columns they reach. The larger of the edges'
+// coverages ignores a NaN one, as the reference's std::max does, so the
+// order in which the edges are weighed does not matter.
+class StripRows {
+public:
+    StripRows(const Strip& strip, const float* inner, const float* outer, std::uint32_t width,
+              std::uint32_t height)
+        : strip_(strip), inner_(inner), outer_(outer), width_(width), height_(height),
+          last_(std::max(width, height) - 1) {}
+
+    bool build() {
+        if (!top_from_.build(width_) || !top_to_.build(width_) || !bottom_from_.build(width_) ||
+            !bottom_to_.build(width_) || !coverage_.build(width_)) {
+            return false;
+        }
+        for (std::uint32_t x = 0; x < width_; ++x) {
+            top_from_[x] = strip_.from(outer_, x);
+            top_to_[x] = strip_.to(inner_, x);
+            bottom_from_[x] = strip_.from(outer_, last_ - x);
+            bottom_to_[x] = strip_.to(inner_, last_ - x);
+        }
+        return true;
+    }
+
+    // Coverage of the columns [x0, x1) of row y.
+    const float* row(std::uint32_t y, std::uint32_t x0, std::uint32_t x1) {
+        float* c = coverage_.get();
+        for (std::uint32_t x = x0; x < x1; ++x) c[x] = 0.0f;
+        const float reach = strip_.reach();
+        const float top = static_cast<float>(y);
+        const float bottom = static_cast<float>(height_ - 1 - y);
+        if (!(top >= reach)) across(c, x0, x1, top, top_from_.get(), top_to_.get());
+        if (!(bottom >= reach)) across(c, x0, x1, bottom, bottom_from_.get(), bottom_to_.get());
+        // Column x is reach or more from the left edge from x = ceil(reach)
+        // on (whole numbers are exact floats at any bitmap size), and from
+        // the right edge up to width - ceil(reach).
+        const auto within = static_cast<std::uint32_t>(std::min(std::ceil(reach), static_cast<float>(width_)));
+        const std::uint32_t left_end = std::min(x1, within);
+        const std::uint32_t right_start = std::max(x0, width_ - within);
+        if (x0 < left_end) {
+            down(c, x0, left_end, 0.0f, 1.0f, strip_.from(outer_, y), strip_.to(inner_, y));
+        }
+        if (right_start < x1) {
+            down(c, right_start, x1, static_cast<float>(width_ - 1), -1.0f, strip_.from(outer_, last_ - y),
+                 strip_.to(inner_, last_ - y));
+        }
+        return c;
+    }
+
+private:
+    // One vertical edge's coverage across a row: column x lies at distance
+    // origin + sign x from it (both exact in float), with the row's tears.
+    static void down(float* c, std::uint32_t x, std::uint32_t x1, float origin, float sign, float from, float to) {
+#if VORLITE_EXACT_FLOAT_LANES
+        namespace simd = vorlite::core::simd;
+        const simd::f32x4 step = {0.0f, 1.0f, 2.0f, 3.0f};
+        for (; x + 4 <= x1; x += 4) {
+            const simd::f32x4 d = simd::splat(origin) + simd::splat(sign) * (simd::splat(static_cast<float>(x)) + step);
+            store_larger(c + x, coverage_lanes(d - simd::splat(from) + simd::splat(0.5f),
+                                               simd::splat(to) - d + simd::splat(0.5f)));
+        }
+#endif
+        for (; x < x1; ++x) {
+            const float d = origin + sign * static_cast<float>(x);
+            c[x] = std::max(c[x], Strip::edge_coverage(d, from, to));
+        }
+    }
+
+    // One horizontal edge's coverage along a row, at distance d from it.
+    static void across(float* c, std::uint32_t x, std::uint32_t x1, float d, const float* from, const float* to) {
+#if VORLITE_EXACT_FLOAT_LANES
+        namespace simd = vorlite::core::simd;
+        const simd::f32x4 distance = simd::splat(d), half = simd::splat(0.5f);
+        for (; x + 4 <= x1; x += 4) {
+            store_larger(c + x, coverage_lanes(distance - simd::load<simd::f32x4>(from + x) + half,
+                                               simd::load<simd::f32x4>(to + x) - distance + half));
+        }
+#endif
+        for (; x < x1; ++x) c[x] = std::max(c[x], Strip::edge_coverage(d, from[x], to[x]));
+    }
+
+#if VORLITE_EXACT_FLOAT_LANES
+    // Strip::edge_coverage lane by lane from its two unclamped ramps, with
+    // std::clamp's and std::min's own comparisons, NaN included.
+    static vorlite::core::simd::f32x4 coverage_lanes(vorlite::core::simd::f32x4 start,
+                                                     vorlite::core::simd::f32x4 end) {
+        namespace simd = vorlite::core::simd;
+        const simd::f32x4 zero = simd::splat(0.0f), one = simd::splat(1.0f);
+        const auto clamp = [&](simd::f32x4 v) {
+            const simd::f32x4 capped = one < v ? one : v;
+            return v < zero ? zero : capped;
+        };
+        start = clamp(start);
+        end = clamp(end);
+        return end < start ? end : start;
+    }
+    // std::max(best, here) lane by lane: a NaN coverage leaves best.
+    static void store_larger(float* c, vorlite::core::simd::f32x4 here) {
+        namespace simd = vorlite::core::simd;
+        const simd::f32x4 best = simd::load<simd::f32x4>(c);
+        simd::store(c, best < here ? here : best);
+    }
+#endif
+
+    const Strip& strip_;
+    const float* inner_;
+    const float* outer_;
+    std::uint32_t width_;
+    std::uint32_t height_;
+    std::uint32_t last_;
+    vorlite::core::WorkingArray<float> top_from_, top_to_, bottom_from_, bottom_to_, coverage_;
+};
+
+// paint_edges for the strip: the same pixels, their coverage taken a row
+// at a time.
+void paint_strip(VorBitmap* bitmap, const VorColor& colour, std::uint32_t mode, float reach, StripRows& rows) {
+    const std::uint32_t width = bitmap->width;
+    const std::uint32_t height = bitmap->height;
+    const float opacity = static_cast<float>(colour.a) * vorlite::core::k_inv255;
+    const FullCover full(colour, mode, opacity);
+    const auto margin = static_cast<std::uint32_t>(std::min(reach, static_cast<float>(std::max(width, height))));
+    const std::uint32_t left_end = std::min(margin, width);
+    const std::uint32_t right_start = std::max(margin >= width ? width : width - margin, left_end);
+    const auto lay_span = [&](std::uint8_t* row, const float* c, std::uint32_t x0, std::uint32_t x1) {
+        for (std::uint32_t x = x0; x < x1; ++x) {
+            if (c[x] == 1.0f && full.tabled()) {
+                full.lay(row + std::size_t{x} * 4);
+            } else if (c[x] > 0.0f) {
+                lay(row + std::size_t{x} * 4, colour, mode, opacity * c[x]);
+            }
+        }
+    };
+    for (std::uint32_t y = 0; y < height; ++y) {
+        std::uint8_t* row = bitmap->data + static_cast<std::size_t>(y) * width * 4;
+        if (y < margin || height - 1 - y < margin) {
+            lay_span(row, rows.row(y, 0, width), 0, width);
+            continue;
+        }
+        lay_span(row, rows.row(y, 0, left_end), 0, left_end);
+        lay_span(row, rows.row(y, right_start, width), right_start, width);
+    }
+}
+
 }  // namespace
+
+namespace vorlite::generate {
+
+void draw_double_sided(VorBitmap* bitmap, const VorBorderParams* params, bool rows) {
+    const std::uint32_t width = bitmap->width;
+    const std::uint32_t height = bitmap->height;
+    if (width < 2 || height < 2 || params->leftProfile == nullptr || params->rightProfile == nullptr) return;
+    const std::uint32_t length = std::max(width, height);
+    VorRNG rng;
+    VorRNGSeed(&rng, params->seed);
+    const float roughness = tuning(params->sideTune2, -4.0f, 16.0f, 0.4f);
+    fill_profile(params->leftProfile, length, roughness, params->mpdMode, &rng);
+    fill_profile(params->rightProfile, length, roughness, params->mpdMode, &rng);
+    const float* inner = params->leftProfile;
+    const float* outer = params->rightProfile;
+    const Strip strip(*params, width, height);
+    const auto mode = static_cast<std::uint32_t>(params->blendMode);
+    if (!rows) {
+        paint_edges(bitmap, params->color, mode, strip.reach(),
+                    [&](std::uint32_t x, std::uint32_t y) { return strip.coverage(inner, outer, x, y); });
+        return;
+    }
+    StripRows strip_rows(strip, inner, outer, width, height);
+    if (!strip_rows.build()) return;
+    paint_strip(bitmap, params->color, mode, strip.reach(), strip_rows);
+}
+
+}  // namespace vorlite::generate
 
 extern "C" {
 
@@ -259,49 +495,14 @@ VOR_API void VorBordersSide(VorBitmap* bitmap, const VorBorderParams* params) {
     fill_profile(params->bottomProfile, length, roughness, params->mpdMode, &rng);
     fill_profile(second.get(), length, roughness, params->mpdMode, &rng);
     const Profiles profiles{params->bottomProfile, second.get(), length};
-    const Band band(*params, profiles, width, height);
+    Band band(*params, profiles, width, height);
+    if (!band.build()) return;
     paint_edges(bitmap, params->color, static_cast<std::uint32_t>(params->blendMode), band.reach(),
                 [&](std::uint32_t x, std::uint32_t y) { return band.coverage(x, y); });
 }
 
 VOR_API void VorBordersDoubleSided(VorBitmap* bitmap, const VorBorderParams* params) {
-    const std::uint32_t width = bitmap->width;
-    const std::uint32_t height = bitmap->height;
-    if (width < 2 || height < 2 || params->leftProfile == nullptr || params->rightProfile == nullptr) return;
-    const std::uint32_t length = std::max(width, height);
-    VorRNG rng;
-    VorRNGSeed(&rng, params->seed);
-    const float roughness = tuning(params->sideTune2, -4.0f, 16.0f, 0.4f);
-    fill_profile(params->leftProfile, length, roughness, params->mpdMode, &rng);
-    fill_profile(params->rightProfile, length, roughness, params->mpdMode, &rng);
-    const float* inner = params->leftProfile;
-    const float* outer = params->rightProfile;
-    const auto sum = static_cast<float>(static_cast<std::uint64_t>(width) + height);
-    const float shorter = static_cast<float>(std::min(width, height));
-    const float depth = std::min(tuning(params->width, 0.0f, 1.0f, 0.0f) * sum, 0.45f * shorter);
-    const float amplitude = std::min(tuning(params->sideTune1, 0.0f, 1.0f, 0.0f) * sum, 0.25f * shorter);
-    const std::uint32_t last = length - 1;
-    const float reach = depth + amplitude * 2.0f + 2.0f;
-    // A strip torn on both sides: its outer edge wanders just inside the
-    // picture's edge, its inner edge about the band's depth; between the
-    // two it covers fully, with a pixel of ramp at each tear. An edge
-    // farther than the strip can reach adds nothing, so most pixels weigh
-    // one edge, not four.
-    const auto cover = [&](std::uint32_t x, std::uint32_t y) {
-        const float d[4] = {static_cast<float>(y), static_cast<float>(height - 1 - y), static_cast<float>(x),
-                            static_cast<float>(width - 1 - x)};
-        const std::uint32_t along[4] = {x, last - x, y, last - y};
-        float best = 0.0f;
-        for (int e = 0; e < 4; ++e) {
-            if (d[e] >= reach) continue;
-            const float from = 0.5f * amplitude * std::fabs(outer[along[e]]);
-            const float to = depth + amplitude * inner[along[e]];
-            const float c = std::min(std::clamp(d[e] - from + 0.5f, 0.0f, 1.0f), std::clamp(to - d[e] + 0.5f, 0.0f, 1.0f));
-            best = std::max(best, c);
-        }
-        return best;
-    };
-    paint_edges(bitmap, params->color, static_cast<std::uint32_t>(params->blendMode), reach, cover);
+    vorlite::generate::draw_double_sided(bitmap, params, true);
 }
 
 }  // extern "C"

@@ -5,6 +5,7 @@
 #include <limits>
 #include <vector>
 
+#include "generate/generate_internal.h"
 #include "tests/test_support.h"
 #include "zentra_vorlite.h"
 
@@ -119,6 +120,38 @@ TEST(SideBorders, MissingProfilesOrWildTuningsNeverReachOutside) {
     SideBorder border(tiny.bitmap, VOR_BORDER_TORN);
     border.draw(tiny.get());
     EXPECT_TRUE(tiny.unchanged());
+}
+
+// The torn strip laid row by row stores what the pixel-by-pixel reference
+// stores: narrow and wide strips, strips that meet in the middle, sizes of
+// a few pixels, tall and wide pictures, a blend mode without tables, and a
+// profile roughness that makes the tears wild.
+TEST(SideBorders, TornStripRowsStoreTheReferenceBytes) {
+    struct Case {
+        uint32_t w, h;
+        double width, amplitude, roughness;
+        int32_t mode;
+    };
+    const Case cases[] = {
+        {97, 61, 0.04, 0.018, 0.4, VOR_BLEND_NORMAL},   {61, 97, 0.12, 0.05, 0.4, VOR_BLEND_SCREEN},
+        {33, 200, 0.3, 0.2, -4.0, VOR_BLEND_OVERLAY},   {2, 2, 0.5, 0.5, 0.4, VOR_BLEND_NORMAL},
+        {5, 3, 0.05, 0.0, 16.0, VOR_BLEND_COLOR},       {130, 9, 1.0, 1.0, 0.4, VOR_BLEND_MULTIPLY},
+    };
+    for (const Case& c : cases) {
+        TestBitmap rows(c.w, c.h), reference(c.w, c.h);
+        SideBorder a(rows.bitmap, VOR_BORDER_TORN_2), b(reference.bitmap, VOR_BORDER_TORN_2);
+        for (SideBorder* border : {&a, &b}) {
+            border->p.width = c.width;
+            border->p.sideTune1 = c.amplitude;
+            border->p.sideTune2 = c.roughness;
+            border->p.blendMode = c.mode;
+            border->p.color.a = 51;
+        }
+        vorlite::generate::draw_double_sided(rows.get(), &a.p, true);
+        vorlite::generate::draw_double_sided(reference.get(), &b.p, false);
+        EXPECT_TRUE(rows == reference) << c.w << "x" << c.h << " " << c.width;
+        EXPECT_FALSE(rows.unchanged()) << c.w << "x" << c.h << " " << c.width;
+    }
 }
 
 }  // namespace
