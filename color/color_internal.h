@@ -21,6 +21,14 @@ const LinearTable& linear_table();
 const CbrtTable& cbrt_table();
 const EncodingTable& encoding_table();
 
+// VorColorRGB2LABDoublesWithCbrtMapping on n pixels, into three arrays.
+void lab_doubles_of_pixels(const std::uint8_t* pixels, std::size_t n, double* L, double* a, double* b);
+
+// VorColorLAB2RGBScaled on n packed L*a*b* pixels in place, four at a
+// time where the lanes allow (lanes = true), or one by one: the reference.
+void lab_to_rgb_pixels(std::uint8_t* pixels, std::size_t n, double scale_l, double scale_a, double scale_b,
+                       bool lanes);
+
 // Blend modes: the result of blending src over each opaque grey v = 0..255
 // with VorColorBlend, stored per channel. Applying red[R], green[G],
 // blue[B] to a pixel is the whole-bitmap form of a one-colour blend.

@@ -240,6 +240,59 @@ inline void lab_to_rgb(VorColor& c, double scale_l, double scale_a, double scale
     c.b = encode_channel(b_lin, encoding);
 }
 
+#if VORLITE_EXACT_FLOAT_LANES
+// lab_to_rgb on four packed pixels: the same double and float operations
+// lane by lane, the encoding table read lane by lane.
+inline void lab_to_rgb_lanes(std::uint8_t* p, double scale_l, double scale_a, double scale_b,
+                             const float* encoding) {
+    namespace simd = core::simd;
+    using simd::f32x4;
+    using simd::f64x2;
+    using simd::i32x4;
+    f32x4 fx, fy, fz;
+    for (int half = 0; half < 2; ++half) {
+        const std::uint8_t* q = p + 8 * half;
+        const f64x2 lb = {static_cast<double>(q[0]), static_cast<double>(q[4])};
+        const f64x2 ab = {static_cast<double>(q[1]), static_cast<double>(q[5])};
+        const f64x2 bb = {static_cast<double>(q[2]), static_cast<double>(q[6])};
+        const f64x2 y = __builtin_convertvector(
+            __builtin_convertvector(((lb * 0.392156870078234) * scale_l + 16.0) * 0.008620689655172414,
+                                    simd::f32x2),
+            f64x2);
+        const auto x = __builtin_convertvector(y + (scale_a * ab - 127.0) * 0.002, simd::f32x2);
+        const auto z = __builtin_convertvector(y + (127.0 - scale_b * bb) * 0.005, simd::f32x2);
+        for (int i = 0; i < 2; ++i) {
+            fx[2 * half + i] = x[i];
+            fy[2 * half + i] = static_cast<float>(y[i]);
+            fz[2 * half + i] = z[i];
+        }
+    }
+    const auto compand = [](f32x4 f) {
+        const f32x4 cube = f * f * f;
+        const f32x4 linear = (f - simd::splat(0.13793103f)) * simd::splat(0.12841916f);
+        return cube > simd::splat(0.008856f) ? cube : linear;
+    };
+    const f32x4 x = compand(fx) * simd::splat(0.95047f);
+    const f32x4 y = compand(fy);
+    const f32x4 z = compand(fz) * simd::splat(1.08883f);
+    const f32x4 linear[3] = {
+        (x * simd::splat(3.2406f) + y * simd::splat(-1.5372f)) + z * simd::splat(-0.4986f),
+        (x * simd::splat(-0.9689f) + y * simd::splat(1.8758f)) + z * simd::splat(0.0415f),
+        (x * simd::splat(0.0557f) + y * simd::splat(-0.204f)) + z * simd::splat(1.057f),
+    };
+    for (int channel = 0; channel < 3; ++channel) {
+        const f32x4 v = linear[channel];
+        const i32x4 inside = (v > simd::splat(0.0f)) & (v < simd::splat(1.0f));
+        // Lanes outside (0, 1) read entry 0 and are replaced below.
+        const i32x4 index = inside & __builtin_convertvector(v * simd::splat(1024.0f), i32x4);
+        const f32x4 e = {encoding[index[0]], encoding[index[1]], encoding[index[2]], encoding[index[3]]};
+        i32x4 level = __builtin_convertvector(e * simd::splat(255.0f) + simd::splat(0.5f), i32x4);
+        level = inside ? level : (v >= simd::splat(1.0f) ? i32x4{255, 255, 255, 255} : i32x4{0, 0, 0, 0});
+        for (int i = 0; i < 4; ++i) p[4 * i + channel] = static_cast<std::uint8_t>(level[i]);
+    }
+}
+#endif
+
 }  // namespace
 
 const LinearTable& linear_table() {
@@ -267,6 +320,34 @@ const EncodingTable& encoding_table() {
         return t;
     }();
     return table;
+}
+
+void lab_doubles_of_pixels(const std::uint8_t* p, std::size_t n, double* L, double* a, double* b) {
+    const float* linear = linear_table().data();
+    const float* cbrt = cbrt_table().data();
+    for (std::size_t i = 0; i < n; ++i) {
+        const Lab lab = rgb_to_lab_tabled(core::load_pixel(p + 4 * i), linear, cbrt);
+        L[i] = lab.L;
+        a[i] = lab.a;
+        b[i] = lab.b;
+    }
+}
+
+void lab_to_rgb_pixels(std::uint8_t* p, std::size_t n, double scale_l, double scale_a, double scale_b, bool lanes) {
+    const float* encoding = encoding_table().data();
+    std::size_t i = 0;
+#if VORLITE_EXACT_FLOAT_LANES
+    if (lanes) {
+        for (; i + 4 <= n; i += 4) lab_to_rgb_lanes(p + 4 * i, scale_l, scale_a, scale_b, encoding);
+    }
+#else
+    (void)lanes;
+#endif
+    for (; i < n; ++i) {
+        VorColor c = core::load_pixel(p + 4 * i);
+        lab_to_rgb(c, scale_l, scale_a, scale_b, encoding);
+        core::store_pixel(p + 4 * i, c);
+    }
 }
 
 }  // namespace vorlite::color
@@ -419,14 +500,8 @@ VOR_API void VorBitmapConvertRGBToLAB(VorBitmap* bitmap) {
 }
 
 VOR_API void VorBitmapConvertLABToRBG(VorBitmap* bitmap, float scaleA, float scaleB) {
-    const float* encoding = encoding_table().data();
-    std::uint8_t* p = bitmap->data;
-    const std::size_t n = vorlite::core::pixel_count(*bitmap);
-    for (std::size_t i = 0; i < n; ++i, p += 4) {
-        VorColor c = vorlite::core::load_pixel(p);
-        lab_to_rgb(c, 1.0, static_cast<double>(scaleA), static_cast<double>(scaleB), encoding);
-        vorlite::core::store_pixel(p, c);
-    }
+    lab_to_rgb_pixels(bitmap->data, vorlite::core::pixel_count(*bitmap), 1.0, static_cast<double>(scaleA),
+                      static_cast<double>(scaleB), true);
 }
 
 }  // extern "C"

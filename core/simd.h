@@ -54,6 +54,7 @@
 #if VORLITE_VECTOR_LANES
 namespace vorlite::core::simd {
 
+using f32x2 = float __attribute__((vector_size(8)));
 using f32x4 = float __attribute__((vector_size(16)));
 using f64x2 = double __attribute__((vector_size(16)));
 using f64x4 = double __attribute__((vector_size(32)));

@@ -135,19 +135,10 @@ public:
     EntryRows(const VorColor* table, std::uint32_t mode, double opacity)
         : table_(table), mode_(mode), opacity_(opacity) {}
     bool build() { return rows_.build(k_table_size * 3, 256) && filled_.build(k_table_size); }
-    // Fills every entry a row of indices uses, so that the pixel loop can
-    // read the rows without asking.
-    void settle(const std::uint16_t* indices, std::uint32_t n) {
-        std::uint32_t last = k_table_size;
-        for (std::uint32_t x = 0; x < n; ++x) {
-            const std::uint32_t index = indices[x];
-            if (index == last) continue;
-            last = index;
-            if (!filled_[index]) fill(index, &rows_[std::size_t{index} * 768]);
-        }
-    }
-    const std::uint8_t (*settled_rows(std::uint32_t index) const)[256] {
-        return reinterpret_cast<const std::uint8_t(*)[256]>(&rows_[std::size_t{index} * 768]);
+    const std::uint8_t* rows(std::uint32_t index) {
+        std::uint8_t* r = &rows_[std::size_t{index} * 768];
+        if (!filled_[index]) fill(index, r);
+        return r;
     }
 
 private:
@@ -256,16 +247,15 @@ void draw_plain(VorBitmap* bitmap, const Coordinates& c, const VorColor* table, 
     for (std::uint32_t y = 0; y < bitmap->height; ++y, row += std::size_t{width} * 4) {
         c.row_indices(y, width, indices.get(), lanes);
         const std::uint16_t* index = indices.get();
-        if (by_rows) {
-            rows.settle(index, width);
-            vorlite::core::for_each_pixel(row, width,
-                                          [&](std::uint8_t* p) { vorlite::core::map_pixel(p, rows.settled_rows(*index++)); });
-        } else {
-            vorlite::core::for_each_pixel(row, width, [&](std::uint8_t* p) {
-                const VorColor& entry = table[*index++];
+        vorlite::core::for_each_pixel(row, width, [&](std::uint8_t* p) {
+            const std::uint16_t i = *index++;
+            if (by_rows) {
+                vorlite::core::map_pixel(p, reinterpret_cast<const std::uint8_t(*)[256]>(rows.rows(i)));
+            } else {
+                const VorColor& entry = table[i];
                 blend_pixel(p, entry, mode, entry_opacity(opacity, entry));
-            });
-        }
+            }
+        });
     }
 }
 

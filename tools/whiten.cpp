@@ -5,6 +5,7 @@
 #include <algorithm>
 #include <cstdint>
 
+#include "color/color_internal.h"
 #include "core/core_internal.h"
 #include "zentra_vorlite.h"
 
@@ -32,10 +33,7 @@ struct Block {
 };
 
 void whiten_block(std::uint8_t* p, std::size_t n, Block& w) {
-    for (std::size_t i = 0; i < n; ++i) {
-        const VorColor colour = vorlite::core::load_pixel(p + 4 * i);
-        VorColorRGB2LABDoublesWithCbrtMapping(&colour, &w.l[i], &w.a[i], &w.b[i]);
-    }
+    vorlite::color::lab_doubles_of_pixels(p, n, w.l, w.a, w.b);
     for (std::size_t i = 0; i < n; ++i) {
         double d = (w.a[i] - 132.0) * (w.a[i] - 132.0);
         // Only a blue shift counts against a pixel: yellowed teeth are the
@@ -49,17 +47,15 @@ void whiten_block(std::uint8_t* p, std::size_t n, Block& w) {
         const float exponent = static_cast<float>(1.0 / (w.k[i] * 0.5 + 1.0));
         w.power[i] = vorlite::core::powf(base, exponent);
     }
+    // The new L*a*b* bytes go into the pixel, which is then converted back
+    // in place (VorColorLAB2RGB, four pixels at a time).
     for (std::size_t i = 0; i < n; ++i) {
         std::uint8_t* pixel = p + 4 * i;
-        VorColor lab = vorlite::core::load_pixel(pixel);
-        lab.r = truncated(static_cast<double>(w.power[i] * 255.0f));
-        lab.g = truncated(w.a[i]);
-        lab.b = truncated((1.0 - w.k[i]) * (w.b[i] + -127.0) + 127.0);
-        VorColorLAB2RGB(&lab);
-        pixel[0] = lab.r;
-        pixel[1] = lab.g;
-        pixel[2] = lab.b;
+        pixel[0] = truncated(static_cast<double>(w.power[i] * 255.0f));
+        pixel[1] = truncated(w.a[i]);
+        pixel[2] = truncated((1.0 - w.k[i]) * (w.b[i] + -127.0) + 127.0);
     }
+    vorlite::color::lab_to_rgb_pixels(p, n, 1.0, 1.0, 1.0, true);
 }
 
 }  // namespace

@@ -73,6 +73,33 @@ TEST(PackedLab, BitmapMatchesPerPixelConversionForEveryColour) {
     }
 }
 
+// The way back, four pixels at a time, must store what the per-pixel
+// conversion stores for any packed triple and chroma scale, the alpha
+// untouched; a ragged last group takes the per-pixel path.
+TEST(PackedLab, BitmapBackMatchesPerPixelConversion) {
+    const struct {
+        uint32_t width, height;
+        float scale_a, scale_b;
+    } cases[] = {{2053, 4099, 1.0f, 1.0f}, {1021, 1031, 1.35f, 0.6f}, {7, 3, 0.0f, 2.0f}, {1, 3, 1.0f, 1.0f}};
+    for (const auto& c : cases) {
+        const uint32_t n = c.width * c.height;
+        std::vector<VorColor> pixels(n), expected(n);
+        for (uint32_t i = 0; i < n; ++i) {
+            const uint32_t lab = (i * 2654435761u) & 0xFFFFFFu;
+            pixels[i] = expected[i] = rgba(lab & 255, (lab >> 8) & 255, lab >> 16, (i * 37 + 42) & 255);
+            VorColorLAB2RGBScaled(&expected[i], 1.0, c.scale_a, c.scale_b);
+        }
+        VorBitmap bitmap{reinterpret_cast<uint8_t*>(pixels.data()), c.width, c.height};
+        VorBitmapConvertLABToRBG(&bitmap, c.scale_a, c.scale_b);
+        const auto same = [](const VorColor& x, const VorColor& y) { return std::memcmp(&x, &y, 4) == 0; };
+        const auto first = std::mismatch(pixels.begin(), pixels.end(), expected.begin(), same);
+        ASSERT_TRUE(first.first == pixels.end())
+            << c.width << " x " << c.height << " at " << (first.first - pixels.begin()) << ": got "
+            << testing::PrintToString(channels(*first.first)) << ", expected "
+            << testing::PrintToString(channels(*first.second));
+    }
+}
+
 TEST(Hsv, WorkedColours) {
     // (red, green, blue) -> (h, s, v); a red maximum with blue above green
     // wraps below 360: -1/255 x 60 + 360 in float is 359.764709.

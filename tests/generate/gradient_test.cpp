@@ -172,8 +172,9 @@ TEST(GradientProcessor, RefusesUnusableDocumentsWithoutTouchingPixels) {
         R"({"colors": [{"color": {"r": 1, "g": 2, "b": 3, "a": 255}, "location": 0}],
             "opacities": [{"opacity": 1, "location": 0}, {"opacity": 1, "location": 100}],
             "gradientShape": "linear", "scale": 1, "xCenter": 0, "yCenter": 0, "angle": 0, "alpha": 1})";
-    const std::string more_opacities =
-        "{" + k_stops.substr(0, k_stops.find("\"opacities\"")) +
+    std::string more_opacities = "{";
+    more_opacities += k_stops.substr(0, k_stops.find("\"opacities\""));
+    more_opacities +=
         R"("opacities": [{"opacity": 1, "location": 0}, {"opacity": 1, "location": 50},
                          {"opacity": 1, "location": 100}],
            "gradientShape": "linear", "scale": 1, "xCenter": 0, "yCenter": 0, "angle": 0, "alpha": 1})";
