@@ -51,6 +51,17 @@
 #endif
 #endif
 
+// On x86-64 a kernel may be built twice, for processors with 256-bit
+// lanes and for the rest, the copy picked at load time; both copies do the
+// same IEEE operations, so the bytes do not depend on the processor. Not
+// under the sanitizers, whose runtimes do not take to the load-time pick.
+#if defined(__x86_64__) && defined(__GNUC__) && !defined(__clang__) && !defined(__SANITIZE_THREAD__) && \
+    !defined(__SANITIZE_ADDRESS__)
+#define VORLITE_AVX2_CLONES __attribute__((target_clones("avx2", "default")))
+#else
+#define VORLITE_AVX2_CLONES
+#endif
+
 #if VORLITE_VECTOR_LANES
 namespace vorlite::core::simd {
 

@@ -2,6 +2,7 @@
 // 1024-entry table and laid over a bitmap in three shapes (linear at an
 // angle, radial, linear weighted by a vignette); the JSON form of the stops
 // and the "gradient" processor.
+#include <algorithm>
 #include <cmath>
 #include <cstddef>
 #include <cstdlib>
@@ -140,6 +141,21 @@ public:
         if (!filled_[index]) fill(index, r);
         return r;
     }
+    // Fills every entry from lo to hi, so that a row whose indices all lie
+    // there reads the rows without asking; [settled_lo_, settled_hi_] is a
+    // run known to be filled.
+    void settle(std::uint32_t lo, std::uint32_t hi) {
+        if (lo >= settled_lo_ && hi <= settled_hi_) return;
+        for (std::uint32_t i = lo; i <= hi; ++i) rows(i);
+        if (hi + 1 < settled_lo_ || lo > settled_hi_ + 1) {
+            settled_lo_ = lo;
+            settled_hi_ = hi;
+        } else {
+            settled_lo_ = std::min(lo, settled_lo_);
+            settled_hi_ = std::max(hi, settled_hi_);
+        }
+    }
+    const std::uint8_t* settled_rows(std::uint32_t index) const { return &rows_[std::size_t{index} * 768]; }
 
 private:
     void fill(std::uint32_t index, std::uint8_t* r) {
@@ -154,9 +170,52 @@ private:
     const VorColor* table_;
     std::uint32_t mode_;
     double opacity_;
+    std::uint32_t settled_lo_ = 1;
+    std::uint32_t settled_hi_ = 0;
     WorkingArray<std::uint8_t> rows_;
     WorkingArray<std::uint8_t> filled_;
 };
+
+// The table index of every pixel of a row from its column parts and the
+// row's part, four at a time where the lanes allow (the same double and
+// float operations lane by lane).
+VORLITE_AVX2_CLONES
+void row_table_indices(const double* columns, double v, bool radial, std::uint32_t width, std::uint16_t* out,
+                       bool lanes) {
+    std::uint32_t x = 0;
+#if VORLITE_EXACT_FLOAT_LANES
+    namespace simd = vorlite::core::simd;
+    using f64x4 = simd::f64x4;
+    if (lanes) {
+        const f64x4 row_lanes = {v, v, v, v};
+        for (; x + 4 <= width; x += 4) {
+            f64x4 column;
+            std::memcpy(&column, &columns[x], sizeof column);
+            f64x4 coordinate;
+            if (radial) {
+                coordinate = row_lanes + column;
+                for (int i = 0; i < 4; ++i) coordinate[i] = std::sqrt(coordinate[i]);
+            } else {
+                coordinate = column - row_lanes;
+            }
+            simd::f32x4 g = __builtin_convertvector(coordinate, simd::f32x4);
+            g = simd::min_or_bound(simd::max_or_bound(g, simd::splat(0.0f)), simd::splat(1.0f));
+            // trunc(a + 0.5) of a = g x 1023 in 0..1023, with a's whole
+            // part and its fraction, both exact in float: no widening.
+            const simd::f32x4 a = g * simd::splat(1023.0f);
+            const simd::i32x4 whole = __builtin_convertvector(a, simd::i32x4);
+            const simd::i32x4 up = (a - __builtin_convertvector(whole, simd::f32x4)) >= simd::splat(0.5f);
+            const simd::i32x4 index = whole - up;
+            for (int i = 0; i < 4; ++i) out[x + i] = static_cast<std::uint16_t>(index[i]);
+        }
+    }
+#else
+    (void)lanes;
+#endif
+    for (; x < width; ++x) {
+        out[x] = static_cast<std::uint16_t>(table_index(radial ? std::sqrt(v + columns[x]) : columns[x] - v));
+    }
+}
 
 // The pixel's place along the gradient: its offset from the origin in
 // units of the gradient's length, projected on the angle or measured as a
@@ -173,10 +232,25 @@ public:
         if (!columns_.build(width)) return false;
         const double inv_width = 1.0 / static_cast<double>(width);
         const double ca = vorlite::core::cos(params.angle);
+        extremes_known_ = true;
         for (std::uint32_t x = 0; x < width; ++x) {
             const double u = (static_cast<double>(x) * inv_width - params.xCenter) * inv_;
             columns_[x] = radial_ ? u * u : u * ca;
+            if (!std::isfinite(columns_[x])) extremes_known_ = false;
+            if (columns_[x] < columns_[lowest_]) lowest_ = x;
+            if (columns_[x] > columns_[highest_]) highest_ = x;
         }
+        return true;
+    }
+    // A row's table index grows with its column part (the projection or
+    // the square of the offset) whatever the row, so the row's smallest and
+    // largest indices lie at the columns where that part is least and
+    // greatest. Unknown where a column part is not finite.
+    bool index_range(std::uint32_t y, std::uint32_t* lo, std::uint32_t* hi) const {
+        if (!extremes_known_) return false;
+        const double v = row(y);
+        *lo = table_index(at(lowest_, v));
+        *hi = table_index(at(highest_, v));
         return true;
     }
     // The row's part: v x sin, or v^2.
@@ -187,37 +261,9 @@ public:
     double at(std::uint32_t x, double row) const {
         return radial_ ? std::sqrt(row + columns_[x]) : columns_[x] - row;
     }
-    // The table index of every pixel of a row, four at a time where the
-    // lanes allow (the same double and float operations lane by lane).
+    // The table index of every pixel of a row.
     void row_indices(std::uint32_t y, std::uint32_t width, std::uint16_t* out, bool lanes) const {
-        const double v = row(y);
-        std::uint32_t x = 0;
-#if VORLITE_EXACT_FLOAT_LANES
-        namespace simd = vorlite::core::simd;
-        using f64x4 = simd::f64x4;
-        if (lanes) {
-            const f64x4 row_lanes = {v, v, v, v};
-            for (; x + 4 <= width; x += 4) {
-                f64x4 column;
-                std::memcpy(&column, &columns_[x], sizeof column);
-                f64x4 coordinate;
-                if (radial_) {
-                    coordinate = row_lanes + column;
-                    for (int i = 0; i < 4; ++i) coordinate[i] = std::sqrt(coordinate[i]);
-                } else {
-                    coordinate = column - row_lanes;
-                }
-                simd::f32x4 g = __builtin_convertvector(coordinate, simd::f32x4);
-                g = simd::min_or_bound(simd::max_or_bound(g, simd::splat(0.0f)), simd::splat(1.0f));
-                const f64x4 scaled = __builtin_convertvector(g * simd::splat(1023.0f), f64x4) + 0.5;
-                const simd::i32x4 index = __builtin_convertvector(scaled, simd::i32x4);
-                for (int i = 0; i < 4; ++i) out[x + i] = static_cast<std::uint16_t>(index[i]);
-            }
-        }
-#else
-        (void)lanes;
-#endif
-        for (; x < width; ++x) out[x] = static_cast<std::uint16_t>(table_index(at(x, v)));
+        row_table_indices(columns_.get(), row(y), radial_, width, out, lanes);
     }
 
 private:
@@ -226,6 +272,9 @@ private:
     double sa_ = 0.0;
     double inv_height_ = 0.0;
     double y_center_ = 0.0;
+    bool extremes_known_ = false;
+    std::uint32_t lowest_ = 0;
+    std::uint32_t highest_ = 0;
     WorkingArray<double> columns_;
 };
 
@@ -243,10 +292,25 @@ void draw_plain(VorBitmap* bitmap, const Coordinates& c, const VorColor* table, 
     const std::uint32_t width = bitmap->width;
     WorkingArray<std::uint16_t> indices;
     if (!indices.build(width)) return;
+    // A large bitmap uses most entries anyway: filling each row's whole
+    // range of entries up front (at most one fill of 768 blends for every
+    // 768 pixels) takes the question out of the pixel loop.
+    const bool settle = lanes && by_rows && vorlite::core::pixel_count(*bitmap) >= std::size_t{k_table_size} * 768;
     std::uint8_t* row = bitmap->data;
     for (std::uint32_t y = 0; y < bitmap->height; ++y, row += std::size_t{width} * 4) {
         c.row_indices(y, width, indices.get(), lanes);
         const std::uint16_t* index = indices.get();
+        std::uint32_t lo = 0, hi = 0;
+        if (settle && c.index_range(y, &lo, &hi)) {
+            rows.settle(lo, hi);
+            vorlite::core::for_each_pixel(row, width, [&](std::uint8_t* p) {
+                const std::uint8_t* r = rows.settled_rows(*index++);
+                p[0] = r[p[0]];
+                p[1] = r[256 + p[1]];
+                p[2] = r[512 + p[2]];
+            });
+            continue;
+        }
         vorlite::core::for_each_pixel(row, width, [&](std::uint8_t* p) {
             const std::uint16_t i = *index++;
             if (by_rows) {

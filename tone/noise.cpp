@@ -62,12 +62,7 @@ bool lanes_exact(float amplitude) {
 }
 
 // n consecutive offsets, exactly as n calls of grain_offset would give.
-// On x86-64 a second copy is built for processors with 256-bit integer
-// lanes and picked at load time; both copies do the same IEEE operations.
-#if defined(__x86_64__) && defined(__GNUC__) && !defined(__clang__) && !defined(__SANITIZE_THREAD__) && \
-    !defined(__SANITIZE_ADDRESS__)
-__attribute__((target_clones("avx2", "default")))
-#endif
+VORLITE_AVX2_CLONES
 void grain_offsets(std::uint32_t* state, float amplitude, int* out, std::size_t n, bool lanes) {
     std::size_t i = 0;
 #if VORLITE_EXACT_FLOAT_LANES

@@ -220,7 +220,9 @@ TEST(GradientProcessor, SurvivesDegenerateNumbers) {
 
 // The row indices formed four at a time store what the pixel-by-pixel
 // reference stores, for every shape, angles that make the coordinate fall
-// and rise, centres and scales that clamp, and the colour mode's own path.
+// and rise, centres and scales that clamp, a scale whose inverse
+// overflows, and the colour mode's own path; on a small bitmap and on one
+// large enough for each row's entries to be filled before its pixels.
 TEST(GradientApply, LanesStoreTheReferenceBytes) {
     struct Case {
         int32_t shape;
@@ -233,6 +235,7 @@ TEST(GradientApply, LanesStoreTheReferenceBytes) {
         {VOR_GRADIENT_LINEAR, 0.01, 0.5, 0.5, -1.2, VOR_BLEND_COLOR},
         {VOR_GRADIENT_RADIAL, 0.6, 0.4, 0.6, 0.0, VOR_BLEND_SCREEN},
         {VOR_GRADIENT_RADIAL, 3e5, -2.0, 7.0, 0.0, VOR_BLEND_NORMAL},
+        {VOR_GRADIENT_LINEAR, 1e-310, 0.5, 0.5, 0.3, VOR_BLEND_OVERLAY},
     };
     Gradient g({{20, 0.0}, {240, 40.0}, {90, 100.0}}, {{1.0, 0.0}, {0.3, 60.0}, {0.8, 100.0}});
     for (const Case& c : cases) {
@@ -243,10 +246,13 @@ TEST(GradientApply, LanesStoreTheReferenceBytes) {
         p.xCenter = c.x;
         p.yCenter = c.y;
         p.angle = c.angle;
-        TestBitmap lanes(67, 23, 5), reference(67, 23, 5);
-        vorlite::generate::apply_gradient(&lanes.bitmap, &p, &g.g, c.mode, 0.9, true);
-        vorlite::generate::apply_gradient(&reference.bitmap, &p, &g.g, c.mode, 0.9, false);
-        EXPECT_EQ(lanes.bytes, reference.bytes) << c.shape << " " << c.angle;
-        EXPECT_NE(lanes.bytes, lanes.before) << c.shape << " " << c.angle;
+        for (const uint32_t width : {67u, 1031u}) {
+            const uint32_t height = width == 67 ? 23 : 769;
+            TestBitmap lanes(width, height, 5), reference(width, height, 5);
+            vorlite::generate::apply_gradient(&lanes.bitmap, &p, &g.g, c.mode, 0.9, true);
+            vorlite::generate::apply_gradient(&reference.bitmap, &p, &g.g, c.mode, 0.9, false);
+            EXPECT_TRUE(lanes.bytes == reference.bytes) << c.shape << " " << c.angle << " " << width;
+            EXPECT_FALSE(lanes.bytes == lanes.before) << c.shape << " " << c.angle << " " << width;
+        }
     }
 }
