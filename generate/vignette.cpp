@@ -193,10 +193,20 @@ struct Vignette {
         // direct blend's bytes beyond the radius too.
         const std::uint16_t full_code =
             mode != VOR_BLEND_COLOR ? static_cast<std::uint16_t>(colour.a) : k_code_full;
+        if (full_code != k_code_full) level_maps(memo, colour, full_code);
+        // A large bitmap asks for most of the ramp's levels anyway: filling
+        // all 256 up front (at most one blend for every 16 pixels) takes the
+        // question out of the rows.
+        const bool every_level =
+            lanes && vorlite::core::pixel_count(*bitmap) >= std::size_t{256} * 768 * 16;
+        if (every_level) {
+            for (std::uint32_t level = 0; level < 256; ++level) level_maps(memo, colour, level);
+        }
         const auto draw_row = [&](std::uint8_t* row) {
             const std::uint16_t* code = codes.get();
             vorlite::core::for_each_pixel(row, width, [&](std::uint8_t* p) {
-                const std::uint16_t c = *code++;
+                std::uint16_t c = *code++;
+                if (c == k_code_full) c = full_code;
                 if (c < k_code_full) {
                     vorlite::core::map_pixel(p, memo->maps[c]);
                 } else if (c == k_code_full) {
@@ -214,7 +224,7 @@ struct Vignette {
             const std::int64_t mirror = cy - ey;
             if (ey > 0 && mirror >= 0) continue;
             row_codes<Stretch, Mode>(y, column_share.get(), column_square.get(), codes.get(), lanes);
-            settle_levels(codes.get(), width, full_code);
+            if (!every_level) settle_levels(codes.get(), width);
             draw_row(bitmap->data + y * stride);
             if (ey < 0 && mirror < static_cast<std::int64_t>(height)) {
                 draw_row(bitmap->data + static_cast<std::size_t>(mirror) * stride);
@@ -223,16 +233,14 @@ struct Vignette {
     }
 
     // Fills every ramp level a row uses before the row is drawn, so the
-    // pixel loop reads the memo's maps without asking; beyond the radius
-    // the memo's own level stands for the full colour where it may.
-    void settle_levels(std::uint16_t* codes, std::uint32_t width, std::uint16_t full_code) const {
-        std::uint16_t last = k_code_clear;
+    // pixel loop reads the memo's maps without asking. Neighbouring codes
+    // differ every few pixels, so the memo's own flag is asked rather than
+    // whether the code changed: that answer is nearly always the same, and
+    // the branch predicts.
+    void settle_levels(const std::uint16_t* codes, std::uint32_t width) const {
         for (std::uint32_t x = 0; x < width; ++x) {
-            std::uint16_t c = codes[x];
-            if (c == k_code_full) c = codes[x] = full_code;
-            if (c == last || c >= k_code_full) continue;
-            level_maps(memo, colour, c);
-            last = c;
+            const std::uint16_t c = codes[x];
+            if (c < k_code_full && memo->computed[c] == 0) level_maps(memo, colour, c);
         }
     }
 

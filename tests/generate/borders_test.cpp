@@ -188,8 +188,8 @@ TEST(VignetteProcessor, DrawsOrRefusesWithoutTouching) {
 }  // namespace
 
 // Rows classified four pixels at a time, the half left of the centre
-// copied from the half right of it, store what the pixel-by-pixel
-// reference stores: every shape mode, stretched or not, centres moved off
+// copied from the half right of it, the ramp's levels made up front on a
+// large bitmap, store what the pixel-by-pixel reference stores: every shape mode, stretched or not, centres moved off
 // the picture, a radius that puts most pixels on the ramp or beyond it,
 // and the colour mode's direct blend beyond the ramp.
 TEST(Vignette, LanesStoreTheReferenceBytes) {
@@ -224,4 +224,16 @@ TEST(Vignette, LanesStoreTheReferenceBytes) {
         EXPECT_TRUE(lanes == reference) << c.shape_mode << " " << c.radius;
         EXPECT_FALSE(lanes.unchanged()) << c.shape_mode << " " << c.radius;
     }
+    // Large enough for every ramp level to be made before the first row.
+    VorBorderParams p;
+    VorBorderInitParams(&p);
+    p.style = VOR_BORDER_VIGNETTE;
+    p.color = VorColor{30, 60, 200, 210};
+    p.blendMode = VOR_BLEND_OVERLAY;
+    p.vignetteScale = 0.55;
+    p.stretch = 1;
+    TestBitmap lanes(2048, 1536), reference(2048, 1536);
+    vorlite::generate::draw_vignette(lanes.get(), &p, true);
+    vorlite::generate::draw_vignette(reference.get(), &p, false);
+    EXPECT_TRUE(lanes == reference);
 }
