@@ -10,6 +10,7 @@
 #include <algorithm>
 #include <cmath>
 #include <cstdint>
+#include <limits>
 
 #include "color/color_internal.h"
 #include "core/core_internal.h"
@@ -320,28 +321,60 @@ public:
             !bottom_to_.build(width_) || !coverage_.build(width_)) {
             return false;
         }
+        top_limit_ = bottom_limit_ = -1.0;
         for (std::uint32_t x = 0; x < width_; ++x) {
             top_from_[x] = strip_.from(outer_, x);
             top_to_[x] = strip_.to(inner_, x);
             bottom_from_[x] = strip_.from(outer_, last_ - x);
             bottom_to_[x] = strip_.to(inner_, last_ - x);
+            top_limit_ = farther(top_limit_, top_to_[x]);
+            bottom_limit_ = farther(bottom_limit_, bottom_to_[x]);
         }
         return true;
     }
 
-    // Coverage of the columns [x0, x1) of row y.
-    const float* row(std::uint32_t y, std::uint32_t x0, std::uint32_t x1) {
+    // Whether the top (bottom) tear can cover anything in row y: it is
+    // within reach, and no column's tear ends more than a pixel above it.
+    bool top_reaches(std::uint32_t y) const {
+        return !(static_cast<float>(y) >= strip_.reach()) && static_cast<double>(y) <= top_limit_;
+    }
+    bool bottom_reaches(std::uint32_t y) const {
+        const std::uint32_t d = height_ - 1 - y;
+        return !(static_cast<float>(d) >= strip_.reach()) && static_cast<double>(d) <= bottom_limit_;
+    }
+
+    // The columns of row y that the left and the right tear can cover, in
+    // at most two spans (one where they meet); returns how many.
+    std::uint32_t side_spans(std::uint32_t y, std::uint32_t (*spans)[2]) const {
+        const std::uint32_t within = reach_columns();
+        std::uint32_t left[2] = {0, within};
+        narrow(left, strip_.from(outer_, y), strip_.to(inner_, y), 0.0, 1.0);
+        std::uint32_t right[2] = {width_ - within, width_};
+        narrow(right, strip_.from(outer_, last_ - y), strip_.to(inner_, last_ - y), static_cast<double>(width_ - 1),
+               -1.0);
+        std::uint32_t n = 0;
+        if (left[0] < left[1] && right[0] < right[1] && right[0] <= left[1] && left[0] <= right[1]) {
+            spans[n][0] = std::min(left[0], right[0]);
+            spans[n++][1] = std::max(left[1], right[1]);
+            return n;
+        }
+        for (const std::uint32_t* s : {left, right}) {
+            if (s[0] < s[1]) {
+                spans[n][0] = s[0];
+                spans[n++][1] = s[1];
+            }
+        }
+        return n;
+    }
+
+    // Coverage of the columns [x0, x1) of row y, with the top and bottom
+    // tears weighed where asked.
+    const float* row(std::uint32_t y, std::uint32_t x0, std::uint32_t x1, bool top, bool bottom) {
         float* c = coverage_.get();
         for (std::uint32_t x = x0; x < x1; ++x) c[x] = 0.0f;
-        const float reach = strip_.reach();
-        const float top = static_cast<float>(y);
-        const float bottom = static_cast<float>(height_ - 1 - y);
-        if (!(top >= reach)) across(c, x0, x1, top, top_from_.get(), top_to_.get());
-        if (!(bottom >= reach)) across(c, x0, x1, bottom, bottom_from_.get(), bottom_to_.get());
-        // Column x is reach or more from the left edge from x = ceil(reach)
-        // on (whole numbers are exact floats at any bitmap size), and from
-        // the right edge up to width - ceil(reach).
-        const auto within = static_cast<std::uint32_t>(std::min(std::ceil(reach), static_cast<float>(width_)));
+        if (top) across(c, x0, x1, static_cast<float>(y), top_from_.get(), top_to_.get());
+        if (bottom) across(c, x0, x1, static_cast<float>(height_ - 1 - y), bottom_from_.get(), bottom_to_.get());
+        const std::uint32_t within = reach_columns();
         const std::uint32_t left_end = std::min(x1, within);
         const std::uint32_t right_start = std::max(x0, width_ - within);
         if (x0 < left_end) {
@@ -355,6 +388,30 @@ public:
     }
 
 private:
+    // Column x is reach or more from the left edge from x = ceil(reach) on
+    // (whole numbers are exact floats at any bitmap size), and from the
+    // right edge up to width - ceil(reach).
+    std::uint32_t reach_columns() const {
+        return static_cast<std::uint32_t>(std::min(std::ceil(strip_.reach()), static_cast<float>(width_)));
+    }
+
+    // A tear covers nothing at distance d when d < from - 1 or d > to + 1:
+    // then one of its two ramps is at most -1 before its half pixel is
+    // added, whatever the rounding. span, the columns [lo, hi) at distance
+    // origin + sign x, is narrowed to those that may be covered.
+    void narrow(std::uint32_t* span, float from, float to, double origin, double sign) const {
+        if (!std::isfinite(from) || !std::isfinite(to)) return;
+        const double nearest = std::ceil(static_cast<double>(from) - 1.0);
+        const double farthest = std::floor(static_cast<double>(to) + 1.0);
+        const double a = (nearest - origin) * sign, b = (farthest - origin) * sign;
+        const double lo = std::min(a, b), hi = std::max(a, b) + 1.0;
+        const auto column = [&](double v) {
+            return static_cast<std::uint32_t>(std::clamp(v, 0.0, static_cast<double>(width_)));
+        };
+        span[0] = std::max(span[0], column(lo));
+        span[1] = std::min(span[1], column(hi));
+    }
+
     // One vertical edge's coverage across a row: column x lies at distance
     // origin + sign x from it (both exact in float), with the row's tears.
     static void down(float* c, std::uint32_t x, std::uint32_t x1, float origin, float sign, float from, float to) {
@@ -409,6 +466,13 @@ private:
     }
 #endif
 
+    // The farthest distance at which a tear ending at `to` may cover: one
+    // pixel beyond it, or everywhere if `to` is not a number.
+    static double farther(double limit, float to) {
+        if (std::isnan(to)) return std::numeric_limits<double>::infinity();
+        return std::max(limit, static_cast<double>(to) + 1.0);
+    }
+
     const Strip& strip_;
     const float* inner_;
     const float* outer_;
@@ -416,18 +480,17 @@ private:
     std::uint32_t height_;
     std::uint32_t last_;
     vorlite::core::WorkingArray<float> top_from_, top_to_, bottom_from_, bottom_to_, coverage_;
+    double top_limit_ = -1.0;
+    double bottom_limit_ = -1.0;
 };
 
-// paint_edges for the strip: the same pixels, their coverage taken a row
-// at a time.
+// paint_edges for the strip, its coverage taken a row at a time and only
+// where a tear may cover: every pixel left out would take coverage 0.
 void paint_strip(VorBitmap* bitmap, const VorColor& colour, std::uint32_t mode, float reach, StripRows& rows) {
     const std::uint32_t width = bitmap->width;
     const std::uint32_t height = bitmap->height;
     const float opacity = static_cast<float>(colour.a) * vorlite::core::k_inv255;
     const FullCover full(colour, mode, opacity);
-    const auto margin = static_cast<std::uint32_t>(std::min(reach, static_cast<float>(std::max(width, height))));
-    const std::uint32_t left_end = std::min(margin, width);
-    const std::uint32_t right_start = std::max(margin >= width ? width : width - margin, left_end);
     const auto lay_span = [&](std::uint8_t* row, const float* c, std::uint32_t x0, std::uint32_t x1) {
         for (std::uint32_t x = x0; x < x1; ++x) {
             if (c[x] == 1.0f && full.tabled()) {
@@ -439,12 +502,17 @@ void paint_strip(VorBitmap* bitmap, const VorColor& colour, std::uint32_t mode, 
     };
     for (std::uint32_t y = 0; y < height; ++y) {
         std::uint8_t* row = bitmap->data + static_cast<std::size_t>(y) * width * 4;
-        if (y < margin || height - 1 - y < margin) {
-            lay_span(row, rows.row(y, 0, width), 0, width);
+        const bool top = rows.top_reaches(y), bottom = rows.bottom_reaches(y);
+        if (top || bottom) {
+            lay_span(row, rows.row(y, 0, width, top, bottom), 0, width);
             continue;
         }
-        lay_span(row, rows.row(y, 0, left_end), 0, left_end);
-        lay_span(row, rows.row(y, right_start, width), right_start, width);
+        // Only the side tears reach this row, each over a span of it.
+        std::uint32_t spans[2][2];
+        const std::uint32_t n = rows.side_spans(y, spans);
+        for (std::uint32_t i = 0; i < n; ++i) {
+            lay_span(row, rows.row(y, spans[i][0], spans[i][1], false, false), spans[i][0], spans[i][1]);
+        }
     }
 }
 
