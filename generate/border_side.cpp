@@ -126,6 +126,53 @@ public:
         return shape(inside, soft);
     }
 
+    // coverage() of the columns [x0, x1) of row y into c, four columns at
+    // a time where the lanes allow: each edge weighed in the same order
+    // with the same strict comparison, so the same edge sets the softness;
+    // the rounded corner and the soft ramps' cosine and power lane by lane.
+    void row_coverage(std::uint32_t y, std::uint32_t x, std::uint32_t x1, float* c, bool lanes) const {
+#if VORLITE_EXACT_FLOAT_LANES
+        namespace simd = vorlite::core::simd;
+        using simd::f32x4;
+        if (lanes) {
+            const f32x4 step = {0.0f, 1.0f, 2.0f, 3.0f};
+            const f32x4 top = simd::splat(static_cast<float>(y));
+            const f32x4 bottom = simd::splat(static_cast<float>(height_ - 1 - y));
+            const f32x4 left_reach = simd::splat(reach_[2][y]), right_reach = simd::splat(reach_[3][y]);
+            const f32x4 left_soft = simd::splat(soft_[2][y]), right_soft = simd::splat(soft_[3][y]);
+            const f32x4 last_column = simd::splat(static_cast<float>(width_ - 1));
+            for (; x + 4 <= x1; x += 4) {
+                const f32x4 column = simd::splat(static_cast<float>(x)) + step;
+                f32x4 inside = simd::splat(-1e30f);
+                f32x4 soft = simd::splat(softness_);
+                const auto weigh = [&](f32x4 into, f32x4 edge_soft) {
+                    const auto deeper = into > inside;
+                    inside = deeper ? into : inside;
+                    soft = deeper ? edge_soft : soft;
+                };
+                weigh(simd::load<f32x4>(&reach_[0][x]) - top, simd::load<f32x4>(&soft_[0][x]));
+                weigh(simd::load<f32x4>(&reach_[1][x]) - bottom, simd::load<f32x4>(&soft_[1][x]));
+                weigh(left_reach - column, left_soft);
+                weigh(right_reach - (last_column - column), right_soft);
+                if (corner_ > 0.0f) {
+                    for (int i = 0; i < 4; ++i) inside[i] = std::max(inside[i], rounded_corner(x + i, y));
+                }
+                if (style_ == VOR_BORDER_TORN || style_ == VOR_BORDER_BULGE || style_ == VOR_BORDER_GLIMMO) {
+                    for (int i = 0; i < 4; ++i) c[x + i] = shape(inside[i], soft[i]);
+                } else {
+                    // std::clamp(inside + 0.5, 0, 1), NaN included.
+                    const f32x4 v = inside + simd::splat(0.5f);
+                    const f32x4 capped = simd::splat(1.0f) < v ? simd::splat(1.0f) : v;
+                    simd::store(c + x, v < simd::splat(0.0f) ? simd::splat(0.0f) : capped);
+                }
+            }
+        }
+#else
+        (void)lanes;
+#endif
+        for (; x < x1; ++x) c[x] = coverage(x, y);
+    }
+
 private:
     float depth_at(float t, float noise) const {
         switch (style_) {
@@ -253,6 +300,39 @@ void paint_edges(VorBitmap* bitmap, const VorColor& colour, std::uint32_t mode, 
             } else if (c > 0.0f) {
                 lay(row + std::size_t{x} * 4, colour, mode, opacity * c);
             }
+        }
+    }
+}
+
+// paint_edges with the coverage of each visited span of a row formed
+// before the span is laid.
+template <typename RowCover>
+void paint_edge_rows(VorBitmap* bitmap, const VorColor& colour, std::uint32_t mode, float reach, float* coverage,
+                     RowCover row_cover) {
+    const std::uint32_t width = bitmap->width;
+    const std::uint32_t height = bitmap->height;
+    const float opacity = static_cast<float>(colour.a) * vorlite::core::k_inv255;
+    const FullCover full(colour, mode, opacity);
+    const auto margin = static_cast<std::uint32_t>(std::min(reach, static_cast<float>(std::max(width, height))));
+    const std::uint32_t left_end = std::min(margin, width);
+    const std::uint32_t right_start = std::max(margin >= width ? width : width - margin, left_end);
+    const auto lay_span = [&](std::uint32_t y, std::uint32_t x0, std::uint32_t x1) {
+        std::uint8_t* row = bitmap->data + static_cast<std::size_t>(y) * width * 4;
+        row_cover(y, x0, x1, coverage);
+        for (std::uint32_t x = x0; x < x1; ++x) {
+            if (coverage[x] == 1.0f && full.tabled()) {
+                full.lay(row + std::size_t{x} * 4);
+            } else if (coverage[x] > 0.0f) {
+                lay(row + std::size_t{x} * 4, colour, mode, opacity * coverage[x]);
+            }
+        }
+    };
+    for (std::uint32_t y = 0; y < height; ++y) {
+        if (y < margin || height - 1 - y < margin) {
+            lay_span(y, 0, width);
+        } else {
+            lay_span(y, 0, left_end);
+            lay_span(y, right_start, width);
         }
     }
 }
@@ -520,6 +600,30 @@ void paint_strip(VorBitmap* bitmap, const VorColor& colour, std::uint32_t mode, 
 
 namespace vorlite::generate {
 
+void draw_side(VorBitmap* bitmap, const VorBorderParams* params, bool lanes) {
+    const std::uint32_t width = bitmap->width;
+    const std::uint32_t height = bitmap->height;
+    // The callers lend one profile of the longer side; the band's second
+    // profile is working memory of its own.
+    if (width < 2 || height < 2 || params->bottomProfile == nullptr) return;
+    const std::uint32_t length = std::max(width, height);
+    vorlite::core::WorkingArray<float> second;
+    if (!second.build(length)) return;
+    VorRNG rng;
+    VorRNGSeed(&rng, params->seed);
+    const float roughness = tuning(params->sideTune2, -4.0f, 16.0f, 0.5f);
+    fill_profile(params->bottomProfile, length, roughness, params->mpdMode, &rng);
+    fill_profile(second.get(), length, roughness, params->mpdMode, &rng);
+    const Profiles profiles{params->bottomProfile, second.get(), length};
+    Band band(*params, profiles, width, height);
+    vorlite::core::WorkingArray<float> coverage;
+    if (!band.build() || !coverage.build(width)) return;
+    paint_edge_rows(bitmap, params->color, static_cast<std::uint32_t>(params->blendMode), band.reach(),
+                    coverage.get(), [&](std::uint32_t y, std::uint32_t x0, std::uint32_t x1, float* c) {
+                        band.row_coverage(y, x0, x1, c, lanes);
+                    });
+}
+
 void draw_double_sided(VorBitmap* bitmap, const VorBorderParams* params, bool rows) {
     const std::uint32_t width = bitmap->width;
     const std::uint32_t height = bitmap->height;
@@ -549,24 +653,7 @@ void draw_double_sided(VorBitmap* bitmap, const VorBorderParams* params, bool ro
 extern "C" {
 
 VOR_API void VorBordersSide(VorBitmap* bitmap, const VorBorderParams* params) {
-    const std::uint32_t width = bitmap->width;
-    const std::uint32_t height = bitmap->height;
-    // The callers lend one profile of the longer side; the band's second
-    // profile is working memory of its own.
-    if (width < 2 || height < 2 || params->bottomProfile == nullptr) return;
-    const std::uint32_t length = std::max(width, height);
-    vorlite::core::WorkingArray<float> second;
-    if (!second.build(length)) return;
-    VorRNG rng;
-    VorRNGSeed(&rng, params->seed);
-    const float roughness = tuning(params->sideTune2, -4.0f, 16.0f, 0.5f);
-    fill_profile(params->bottomProfile, length, roughness, params->mpdMode, &rng);
-    fill_profile(second.get(), length, roughness, params->mpdMode, &rng);
-    const Profiles profiles{params->bottomProfile, second.get(), length};
-    Band band(*params, profiles, width, height);
-    if (!band.build()) return;
-    paint_edges(bitmap, params->color, static_cast<std::uint32_t>(params->blendMode), band.reach(),
-                [&](std::uint32_t x, std::uint32_t y) { return band.coverage(x, y); });
+    vorlite::generate::draw_side(bitmap, params, true);
 }
 
 VOR_API void VorBordersDoubleSided(VorBitmap* bitmap, const VorBorderParams* params) {

@@ -74,6 +74,10 @@ inline std::int64_t vignette_offset(std::uint32_t size, double fraction) {
 // lanes are held against.
 void draw_vignette(VorBitmap* bitmap, const VorBorderParams* params, bool lanes);
 
+// VorBordersSide with each row's coverage formed four columns at a time
+// where the lanes allow (lanes = true), or one by one: the reference.
+void draw_side(VorBitmap* bitmap, const VorBorderParams* params, bool lanes);
+
 // VorBordersDoubleSided with each row's coverage formed before the row is
 // laid (rows = true), or pixel by pixel: the reference.
 void draw_double_sided(VorBitmap* bitmap, const VorBorderParams* params, bool rows);

@@ -122,6 +122,27 @@ TEST(SideBorders, MissingProfilesOrWildTuningsNeverReachOutside) {
     EXPECT_TRUE(tiny.unchanged());
 }
 
+// Side frames with rows formed four columns at a time store what the
+// column-by-column reference stores: every side style, odd and tiny sizes,
+// tall and wide pictures, wide bands that meet in the middle.
+TEST(SideBorders, LanesStoreTheReferenceBytes) {
+    const uint32_t sizes[][2] = {{97, 61}, {61, 97}, {5, 3}, {2, 2}, {130, 9}};
+    for (const int32_t style : {VOR_BORDER_BULGE, VOR_BORDER_TORN, VOR_BORDER_RECT, VOR_BORDER_ROUND,
+                                VOR_BORDER_GLIMMO}) {
+        for (const auto& size : sizes) {
+            for (const double width : {0.0, 0.05, 0.4}) {
+                TestBitmap lanes(size[0], size[1]), reference(size[0], size[1]);
+                SideBorder a(lanes.bitmap, style), b(reference.bitmap, style);
+                a.p.width = b.p.width = width;
+                a.p.color.a = b.p.color.a = 180;
+                vorlite::generate::draw_side(lanes.get(), &a.p, true);
+                vorlite::generate::draw_side(reference.get(), &b.p, false);
+                EXPECT_TRUE(lanes == reference) << style << " " << size[0] << "x" << size[1] << " " << width;
+            }
+        }
+    }
+}
+
 // The torn strip laid row by row stores what the pixel-by-pixel reference
 // stores: narrow and wide strips, strips that meet in the middle, sizes of
 // a few pixels, tall and wide pictures, a blend mode without tables, and a
