@@ -2,6 +2,9 @@
 // green histogram is applied not pixel by pixel but through box means of
 // grey levels, so each pixel takes on the brightness change of its
 // neighbourhood while keeping, slightly amplified, its own detail.
+#include <algorithm>
+#include <array>
+
 #include "core/core_internal.h"
 #include "tone/tone_internal.h"
 
@@ -34,8 +37,11 @@ int transfer(int channel, int detail, int mean_original, int mean_mapped) {
 // most 255 for every bitmap size allowed: the largest box (about 16.4
 // million pixels, for a 4044 x 265514 bitmap) totals below 2^32, so its sum
 // is exact even where the table entries have wrapped.
-void apply_local_means(VorBitmap* bitmap, const std::uint32_t* original,
-                       const std::uint32_t* mapped, int radius) {
+//
+// The plain form divides twice a pixel by the box area and three times by
+// the original mean; it stays as the reference of the fast form below.
+void apply_local_means_reference(VorBitmap* bitmap, const std::uint32_t* original,
+                                 const std::uint32_t* mapped, int radius) {
     const std::uint32_t width = bitmap->width;
     const int last_x = static_cast<int>(width) - 1;
     const int last_y = static_cast<int>(bitmap->height) - 1;
@@ -62,6 +68,144 @@ void apply_local_means(VorBitmap* bitmap, const std::uint32_t* original,
         }
     }
 }
+
+}  // namespace
+
+namespace vorlite::tone {
+
+// n / d as a multiply and a shift. With m = ceil(2^k / d), m d = 2^k + e for
+// some 0 <= e < d, so n m / 2^k = n / d + n e / (d 2^k). Writing n = q d + r
+// with r <= d - 1, the floor stays q while r + n e / 2^k < d, which holds for
+// every n with n e < 2^k, and so for every n with n (d - 1) < 2^k.
+ExactDivider::ExactDivider(std::uint32_t divisor, unsigned shift)
+    : multiplier(((std::uint64_t{1} << shift) + divisor - 1) / divisor), shift(shift) {}
+
+namespace {
+
+// Box sums reach 255 x area: exact below 2^40 while 255 area (area - 1)
+// stays below 2^40, that is for every area up to 65,535 (a box radius up to
+// 127, pictures up to about 17,000 pixels wide plus high). The products stay
+// below 2^24 x 2^40.
+constexpr unsigned k_area_shift = 40;
+bool area_divides_fast(std::uint32_t area) {
+    return area <= 65535u;
+}
+
+// The ratio of means: |mean_m x e| is at most 255 x 331 < 2^17 (e is a level
+// plus a detail of at most 1228 x 255 / 4096, that is 76, either way), so
+// with a shift of 32 the condition is 2^17 x 254 < 2^32, true for every
+// divisor 1..255; the products stay below 2^49.
+constexpr unsigned k_mean_shift = 32;
+
+const std::array<ExactDivider, 256>& mean_dividers() {
+    static const std::array<ExactDivider, 256> dividers = [] {
+        std::array<ExactDivider, 256> d{};
+        for (std::uint32_t i = 1; i < 256; ++i) d[i] = ExactDivider(i, k_mean_shift);
+        return d;
+    }();
+    return dividers;
+}
+
+// C's division truncates toward zero: divide the magnitude.
+inline int divide_toward_zero(int n, const ExactDivider& d) {
+    const int sign = n >> 31;  // 0 or -1: the magnitude and the sign without a branch
+    const auto magnitude = static_cast<std::uint32_t>((n ^ sign) - sign);
+    return (static_cast<int>(d.divide(magnitude)) ^ sign) - sign;
+}
+
+inline int transfer_fast(int channel, int detail, int mean_original, int mean_mapped, const ExactDivider& by_mean) {
+    const int e = channel + detail;
+    const int delta = mean_mapped - mean_original;
+    return (1639 * (e + delta)) / 4096 + (2457 * divide_toward_zero(mean_mapped * e, by_mean)) / 4096;
+}
+
+// One pixel given its two box sums and the divider of its box's area.
+template <typename DivideArea>
+inline void local_pixel(std::uint8_t* p, std::uint32_t sum_o, std::uint32_t sum_m, DivideArea divide_area,
+                        const std::array<ExactDivider, 256>& by_mean) {
+    const auto mean_o = static_cast<int>(divide_area(sum_o));
+    const auto mean_m = static_cast<int>(divide_area(sum_m));
+    const int luminance = (8192 * p[0] + 28672 * p[1] + 4096 * p[2] + 2048) / 40960;
+    const int detail = (1228 * (luminance - mean_o)) / 4096;
+    if (mean_o != 0) {
+        const ExactDivider& d = by_mean[static_cast<std::size_t>(mean_o)];
+        p[0] = clamp_byte(transfer_fast(p[0], detail, mean_o, mean_m, d));
+        p[1] = clamp_byte(transfer_fast(p[1], detail, mean_o, mean_m, d));
+        p[2] = clamp_byte(transfer_fast(p[2], detail, mean_o, mean_m, d));
+    } else {
+        p[0] = clamp_byte(transfer(p[0], detail, 0, mean_m));
+        p[1] = clamp_byte(transfer(p[1], detail, 0, mean_m));
+        p[2] = clamp_byte(transfer(p[2], detail, 0, mean_m));
+    }
+    p[3] = 255;
+}
+
+// Each row in three spans: the columns whose box the left or right edge
+// cuts, divided by their own area, and between them the columns whose box
+// is whole, all of one area, divided by a multiply.
+void apply_local_means_fast(VorBitmap* bitmap, const std::uint32_t* original, const std::uint32_t* mapped,
+                            int radius) {
+    const std::uint32_t width = bitmap->width;
+    const int last_x = static_cast<int>(width) - 1;
+    const int last_y = static_cast<int>(bitmap->height) - 1;
+    const auto& by_mean = mean_dividers();
+    const int inner_first = std::min(radius, last_x + 1);
+    const int inner_end = std::max(inner_first, last_x + 1 - radius);
+    for (int y = 0; y <= last_y; ++y) {
+        const auto y0 = static_cast<std::uint32_t>(y - radius < 0 ? 0 : y - radius);
+        const auto y1 = static_cast<std::uint32_t>(y + radius > last_y ? last_y : y + radius);
+        const std::uint32_t rows = y1 - y0 + 1;
+        std::uint8_t* row = bitmap->data + static_cast<std::size_t>(y) * width * 4;
+        const auto cut = [&](int x) {
+            const auto x0 = static_cast<std::uint32_t>(x - radius < 0 ? 0 : x - radius);
+            const auto x1 = static_cast<std::uint32_t>(x + radius > last_x ? last_x : x + radius);
+            const std::uint32_t area = (x1 - x0 + 1) * rows;
+            local_pixel(row + std::size_t{4} * static_cast<std::uint32_t>(x), box_sum(original, width, x0, y0, x1, y1),
+                        box_sum(mapped, width, x0, y0, x1, y1), [area](std::uint32_t n) { return n / area; },
+                        by_mean);
+        };
+        for (int x = 0; x < inner_first; ++x) cut(x);
+        if (inner_first < inner_end) {
+            const std::uint32_t area = static_cast<std::uint32_t>(2 * radius + 1) * rows;
+            const ExactDivider by_area(area, k_area_shift);
+            const auto divide = [&by_area](std::uint32_t n) { return by_area.divide(n); };
+            // Whole boxes: x0 = x - radius >= 0 and x1 = x + radius <= last_x.
+            const std::size_t above = y0 > 0 ? static_cast<std::size_t>(y0 - 1) * width : 0;
+            const std::size_t below = static_cast<std::size_t>(y1) * width;
+            for (int x = inner_first; x < inner_end; ++x) {
+                const auto x0 = static_cast<std::uint32_t>(x - radius);
+                const auto x1 = static_cast<std::uint32_t>(x + radius);
+                const auto sum = [&](const std::uint32_t* s) {
+                    std::uint32_t v = s[below + x1];
+                    if (x0 > 0) v -= s[below + x0 - 1];
+                    if (y0 > 0) {
+                        v -= s[above + x1];
+                        if (x0 > 0) v += s[above + x0 - 1];
+                    }
+                    return v;
+                };
+                local_pixel(row + std::size_t{4} * static_cast<std::uint32_t>(x), sum(original), sum(mapped), divide,
+                            by_mean);
+            }
+        }
+        for (int x = inner_end; x <= last_x; ++x) cut(x);
+    }
+}
+
+}  // namespace
+
+void clarity_local_means(VorBitmap* bitmap, const std::uint32_t* original, const std::uint32_t* mapped, int radius,
+                         bool reference) {
+    if (!reference && area_divides_fast(static_cast<std::uint32_t>(2 * radius + 1) * static_cast<std::uint32_t>(2 * radius + 1))) {
+        apply_local_means_fast(bitmap, original, mapped, radius);
+    } else {
+        apply_local_means_reference(bitmap, original, mapped, radius);
+    }
+}
+
+}  // namespace vorlite::tone
+
+namespace {
 
 // Gain per level: how far the green distribution runs ahead of a uniform
 // one, to the power 0.33. Gains never go below 1, so the curve only lifts
@@ -99,7 +243,7 @@ VOR_API void VorBlurHistMap(VorBitmap* bitmap, const VorHistMap* map) {
     // pixel, holds the integral image of the unchanged bitmap.
     auto* const original = reinterpret_cast<std::uint32_t*>(copy.get()->data);
     VorBuildIntegralImageGray(bitmap, original);
-    if (height >= 1) apply_local_means(bitmap, original, mapped.get(), radius);
+    if (height >= 1) vorlite::tone::clarity_local_means(bitmap, original, mapped.get(), radius, false);
 }
 
 VOR_API void VorLocalContrastEnhanceProcessor(VorBitmap* bitmap) {

@@ -42,6 +42,23 @@ inline std::uint32_t box_sum(const std::uint32_t* sums, std::uint32_t width, std
     return sum;
 }
 
+// Integer division by a divisor fixed in advance, as a 64-bit multiply and
+// a shift: exact for every n with n x (divisor - 1) < 2^shift.
+struct ExactDivider {
+    std::uint64_t multiplier = 0;
+    unsigned shift = 0;
+    ExactDivider() = default;
+    ExactDivider(std::uint32_t divisor, unsigned shift);
+    std::uint32_t divide(std::uint32_t n) const { return static_cast<std::uint32_t>((n * multiplier) >> shift); }
+};
+
+// Local contrast: the per-pixel pass of VorBlurHistMap over the grey
+// integral images of the original and the mapped picture. The fast form
+// divides by multiplies where the divisor repeats; `reference` asks for
+// the plain divisions it is held against.
+void clarity_local_means(VorBitmap* bitmap, const std::uint32_t* original, const std::uint32_t* mapped, int radius,
+                         bool reference);
+
 // Sharpening and soft focus: the shape of one box-hybrid pass for a bitmap
 // of the given size and amount. The pass sums 2r + 1 boxes of b pixels,
 // box r covering x - m .. x + m; sigma is the Gaussian's deviation in boxes.

@@ -1,8 +1,10 @@
 #include <gtest/gtest.h>
 
 #include <tuple>
+#include <vector>
 
 #include "tests/test_support.h"
+#include "tone/tone_internal.h"
 
 namespace {
 
@@ -55,6 +57,49 @@ TEST(Clarity, LiftsADarkImageButKeepsBlack) {
     long before = 0, after = 0;
     for (size_t i = 0; i < 60 * 45; ++i) before += i * 7 % 64 + 10, after += dark.bytes[4 * i + 1];
     EXPECT_GT(after, before + before / 5);  // all mass below level 74: lifted
+}
+
+TEST(ClarityDivisions, MultiplyAndShiftEqualDivisionOverTheWholeRange) {
+    // Every original mean as divisor against every numerator the ratio of
+    // means can meet (|mean x level| < 2^17), and every box area the fast
+    // pass accepts against the sums at, just below and at the top of each
+    // multiple it can reach (255 x area at most).
+    for (uint32_t d = 1; d < 256; ++d) {
+        const vorlite::tone::ExactDivider by(d, 32);
+        for (uint32_t n = 0; n < (1u << 17); ++n) ASSERT_EQ(by.divide(n), n / d) << n << " / " << d;
+    }
+    for (uint32_t area = 1; area <= 65535; ++area) {
+        const vorlite::tone::ExactDivider by(area, 40);
+        for (uint32_t k = 1; k <= 255; ++k) {
+            const uint32_t n = k * area;
+            ASSERT_EQ(by.divide(n - 1), (n - 1) / area) << n - 1 << " / " << area;
+            ASSERT_EQ(by.divide(n), k) << n << " / " << area;
+        }
+    }
+}
+
+TEST(ClarityDivisions, FastPassGivesTheReferenceBytes) {
+    struct Case {
+        uint32_t w, h;
+        int radius;
+        int fill;  // -1 random bytes biased to the extremes, else a grey level
+    };
+    const Case cases[] = {{1, 40, 3, -1},  {40, 1, 3, -1},  {37, 23, 0, -1}, {37, 23, 1, -1}, {37, 23, 5, -1},
+                          {37, 23, 30, -1}, {61, 59, 7, -1}, {64, 48, 127, -1}, {31, 29, 4, 0},  {31, 29, 4, 200},
+                          {300, 7, 12, -1}};
+    for (const Case& c : cases) {
+        TestBitmap fast = c.fill < 0 ? TestBitmap(c.w, c.h, 9) : grey(c.w, c.h, static_cast<uint8_t>(c.fill));
+        TestBitmap mapped = fast;
+        for (size_t i = 0; i < mapped.bytes.size(); ++i)
+            if (i % 4 != 3) mapped.bytes[i] = static_cast<uint8_t>(std::min(255, mapped.bytes[i] * 3 / 2 + 7));
+        std::vector<uint32_t> original_sums(size_t{c.w} * c.h), mapped_sums(original_sums.size());
+        VorBuildIntegralImageGray(fast.get(), original_sums.data());
+        VorBuildIntegralImageGray(mapped.get(), mapped_sums.data());
+        TestBitmap reference = fast;
+        vorlite::tone::clarity_local_means(fast.get(), original_sums.data(), mapped_sums.data(), c.radius, false);
+        vorlite::tone::clarity_local_means(reference.get(), original_sums.data(), mapped_sums.data(), c.radius, true);
+        EXPECT_TRUE(fast == reference) << c.w << "x" << c.h << " radius " << c.radius << " fill " << c.fill;
+    }
 }
 
 }  // namespace
