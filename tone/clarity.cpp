@@ -82,6 +82,8 @@ ExactDivider::ExactDivider(std::uint32_t divisor, unsigned shift)
 
 namespace {
 
+using vorlite::core::WorkingArray;
+
 // Box sums reach 255 x area: exact below 2^40 while 255 area (area - 1)
 // stays below 2^40, that is for every area up to 65,535 (a box radius up to
 // 127, pictures up to about 17,000 pixels wide plus high). The products stay
@@ -140,66 +142,148 @@ inline void local_pixel(std::uint8_t* p, std::uint32_t sum_o, std::uint32_t sum_
     p[3] = 255;
 }
 
-// Each row in three spans: the columns whose box the left or right edge
-// cuts, divided by their own area, and between them the columns whose box
-// is whole, all of one area, divided by a multiply.
-void apply_local_means_fast(VorBitmap* bitmap, const std::uint32_t* original, const std::uint32_t* mapped,
-                            int radius) {
-    const std::uint32_t width = bitmap->width;
-    const int last_x = static_cast<int>(width) - 1;
-    const int last_y = static_cast<int>(bitmap->height) - 1;
+// A row's box sums from the integral rows at its box's last row (below)
+// and just above its first (above, null for a box from the top).
+struct BoxRows {
+    const std::uint32_t* below;
+    const std::uint32_t* above;
+    std::uint32_t sum(std::uint32_t x0, std::uint32_t x1) const {
+        std::uint32_t v = below[x1];
+        if (x0 > 0) v -= below[x0 - 1];
+        if (above != nullptr) {
+            v -= above[x1];
+            if (x0 > 0) v += above[x0 - 1];
+        }
+        return v;
+    }
+};
+
+// One row of the pass in three spans: the columns whose box the left or
+// right edge cuts, divided by their own area, and between them the columns
+// whose box is whole, all of one area, divided by a multiply.
+void local_means_row(std::uint8_t* row, std::uint32_t width, int radius, std::uint32_t box_rows,
+                     const BoxRows& original, const BoxRows& mapped) {
     const auto& by_mean = mean_dividers();
+    const int last_x = static_cast<int>(width) - 1;
     const int inner_first = std::min(radius, last_x + 1);
     const int inner_end = std::max(inner_first, last_x + 1 - radius);
+    const auto cut = [&](int x) {
+        const auto x0 = static_cast<std::uint32_t>(x - radius < 0 ? 0 : x - radius);
+        const auto x1 = static_cast<std::uint32_t>(x + radius > last_x ? last_x : x + radius);
+        const std::uint32_t area = (x1 - x0 + 1) * box_rows;
+        local_pixel(row + std::size_t{4} * static_cast<std::uint32_t>(x), original.sum(x0, x1), mapped.sum(x0, x1),
+                    [area](std::uint32_t n) { return n / area; }, by_mean);
+    };
+    for (int x = 0; x < inner_first; ++x) cut(x);
+    const std::uint32_t area = static_cast<std::uint32_t>(2 * radius + 1) * box_rows;
+    if (inner_first < inner_end && area_divides_fast(area)) {
+        const ExactDivider by_area(area, k_area_shift);
+        const auto divide = [&by_area](std::uint32_t n) { return by_area.divide(n); };
+        for (int x = inner_first; x < inner_end; ++x) {
+            const auto x0 = static_cast<std::uint32_t>(x - radius);
+            const auto x1 = static_cast<std::uint32_t>(x + radius);
+            local_pixel(row + std::size_t{4} * static_cast<std::uint32_t>(x), original.sum(x0, x1),
+                        mapped.sum(x0, x1), divide, by_mean);
+        }
+    } else {
+        for (int x = inner_first; x < inner_end; ++x) cut(x);
+    }
+    for (int x = inner_end; x <= last_x; ++x) cut(x);
+}
+
+// The two grey integral images a few rows at a time: a pass over row y
+// reads only the integral rows y + r and y - r - 1, so a ring of 2r + 2
+// rows of each serves the whole pass, built just ahead of it from rows the
+// pass has not yet written. No copy of the bitmap and no full-size table.
+class IntegralRings {
+public:
+    IntegralRings(const VorBitmap& bitmap, const VorHistMap& map, int radius)
+        : bitmap_(bitmap), map_(map),
+          rows_(static_cast<std::uint32_t>(
+              std::min<std::uint64_t>(bitmap.height, 2 * static_cast<std::uint64_t>(radius) + 2))) {}
+
+    bool build() { return original_.build(rows_, bitmap_.width) && mapped_.build(rows_, bitmap_.width); }
+
+    // The integral rows of both images at row y, built up to it if needed.
+    void rows_at(std::uint32_t y, const std::uint32_t** original, const std::uint32_t** mapped) {
+        while (built_ < static_cast<std::int64_t>(y)) add_row(static_cast<std::uint32_t>(++built_));
+        *original = slot(original_, y);
+        *mapped = slot(mapped_, y);
+    }
+
+private:
+    std::uint32_t* slot(const WorkingArray<std::uint32_t>& ring, std::uint32_t y) const {
+        return ring.get() + static_cast<std::size_t>(y % rows_) * bitmap_.width;
+    }
+    // Each entry is its row's running total plus the entry above, as
+    // VorBuildIntegralImageGray forms it; the mapped grey is that of the
+    // pixel through the map, as VorBitmapHistogramTransform would leave it.
+    void add_row(std::uint32_t y) {
+        const std::uint32_t width = bitmap_.width;
+        const std::uint8_t* p = bitmap_.data + static_cast<std::size_t>(y) * width * 4;
+        std::uint32_t* original = slot(original_, y);
+        std::uint32_t* mapped = slot(mapped_, y);
+        const std::uint32_t* original_above = y > 0 ? slot(original_, y - 1) : nullptr;
+        const std::uint32_t* mapped_above = y > 0 ? slot(mapped_, y - 1) : nullptr;
+        std::uint32_t original_total = 0, mapped_total = 0;
+        for (std::uint32_t x = 0; x < width; ++x, p += 4) {
+            const std::uint8_t through_map[3] = {map_.map[0][p[0]], map_.map[1][p[1]], map_.map[2][p[2]]};
+            original_total += grey_level(p);
+            mapped_total += grey_level(through_map);
+            original[x] = original_total + (original_above != nullptr ? original_above[x] : 0);
+            mapped[x] = mapped_total + (mapped_above != nullptr ? mapped_above[x] : 0);
+        }
+    }
+
+    const VorBitmap& bitmap_;
+    const VorHistMap& map_;
+    std::uint32_t rows_;
+    std::int64_t built_ = -1;
+    WorkingArray<std::uint32_t> original_;
+    WorkingArray<std::uint32_t> mapped_;
+};
+
+void blur_hist_map_streamed(VorBitmap* bitmap, const VorHistMap& map, int radius) {
+    const std::uint32_t width = bitmap->width;
+    const int last_y = static_cast<int>(bitmap->height) - 1;
+    IntegralRings rings(*bitmap, map, radius);
+    if (!rings.build()) return;
     for (int y = 0; y <= last_y; ++y) {
         const auto y0 = static_cast<std::uint32_t>(y - radius < 0 ? 0 : y - radius);
         const auto y1 = static_cast<std::uint32_t>(y + radius > last_y ? last_y : y + radius);
-        const std::uint32_t rows = y1 - y0 + 1;
-        std::uint8_t* row = bitmap->data + static_cast<std::size_t>(y) * width * 4;
-        const auto cut = [&](int x) {
-            const auto x0 = static_cast<std::uint32_t>(x - radius < 0 ? 0 : x - radius);
-            const auto x1 = static_cast<std::uint32_t>(x + radius > last_x ? last_x : x + radius);
-            const std::uint32_t area = (x1 - x0 + 1) * rows;
-            local_pixel(row + std::size_t{4} * static_cast<std::uint32_t>(x), box_sum(original, width, x0, y0, x1, y1),
-                        box_sum(mapped, width, x0, y0, x1, y1), [area](std::uint32_t n) { return n / area; },
-                        by_mean);
-        };
-        for (int x = 0; x < inner_first; ++x) cut(x);
-        if (inner_first < inner_end) {
-            const std::uint32_t area = static_cast<std::uint32_t>(2 * radius + 1) * rows;
-            const ExactDivider by_area(area, k_area_shift);
-            const auto divide = [&by_area](std::uint32_t n) { return by_area.divide(n); };
-            // Whole boxes: x0 = x - radius >= 0 and x1 = x + radius <= last_x.
-            const std::size_t above = y0 > 0 ? static_cast<std::size_t>(y0 - 1) * width : 0;
-            const std::size_t below = static_cast<std::size_t>(y1) * width;
-            for (int x = inner_first; x < inner_end; ++x) {
-                const auto x0 = static_cast<std::uint32_t>(x - radius);
-                const auto x1 = static_cast<std::uint32_t>(x + radius);
-                const auto sum = [&](const std::uint32_t* s) {
-                    std::uint32_t v = s[below + x1];
-                    if (x0 > 0) v -= s[below + x0 - 1];
-                    if (y0 > 0) {
-                        v -= s[above + x1];
-                        if (x0 > 0) v += s[above + x0 - 1];
-                    }
-                    return v;
-                };
-                local_pixel(row + std::size_t{4} * static_cast<std::uint32_t>(x), sum(original), sum(mapped), divide,
-                            by_mean);
-            }
-        }
-        for (int x = inner_end; x <= last_x; ++x) cut(x);
+        BoxRows original{nullptr, nullptr}, mapped{nullptr, nullptr};
+        if (y0 > 0) rings.rows_at(y0 - 1, &original.above, &mapped.above);
+        rings.rows_at(y1, &original.below, &mapped.below);
+        local_means_row(bitmap->data + static_cast<std::size_t>(y) * width * 4, width, radius, y1 - y0 + 1,
+                        original, mapped);
     }
+}
+
+// The pass as written: a mapped copy, both grey integral images in full,
+// and the plain divisions.
+void blur_hist_map_reference(VorBitmap* bitmap, const VorHistMap& map, int radius) {
+    const std::uint32_t width = bitmap->width;
+    const std::uint32_t height = bitmap->height;
+    vorlite::core::WorkingBitmap copy;
+    if (!copy.build_copy(*bitmap)) return;
+    VorBitmapHistogramTransform(copy.get(), &map);
+    WorkingArray<std::uint32_t> mapped;
+    if (!mapped.build(width, height)) return;
+    VorBuildIntegralImageGray(copy.get(), mapped.get());
+    // The mapped pixels are no longer needed: their storage, four bytes a
+    // pixel, holds the integral image of the unchanged bitmap.
+    auto* const original = reinterpret_cast<std::uint32_t*>(copy.get()->data);
+    VorBuildIntegralImageGray(bitmap, original);
+    if (height >= 1) apply_local_means_reference(bitmap, original, mapped.get(), radius);
 }
 
 }  // namespace
 
-void clarity_local_means(VorBitmap* bitmap, const std::uint32_t* original, const std::uint32_t* mapped, int radius,
-                         bool reference) {
-    if (!reference && area_divides_fast(static_cast<std::uint32_t>(2 * radius + 1) * static_cast<std::uint32_t>(2 * radius + 1))) {
-        apply_local_means_fast(bitmap, original, mapped, radius);
+void blur_hist_map(VorBitmap* bitmap, const VorHistMap* map, int radius, bool reference) {
+    if (reference) {
+        blur_hist_map_reference(bitmap, *map, radius);
     } else {
-        apply_local_means_reference(bitmap, original, mapped, radius);
+        blur_hist_map_streamed(bitmap, *map, radius);
     }
 }
 
@@ -230,20 +314,7 @@ void green_gains(const VorHistogram& histogram, std::uint32_t pixels, float gain
 extern "C" {
 
 VOR_API void VorBlurHistMap(VorBitmap* bitmap, const VorHistMap* map) {
-    const std::uint32_t width = bitmap->width;
-    const std::uint32_t height = bitmap->height;
-    const int radius = box_radius(width, height);
-    vorlite::core::WorkingBitmap copy;
-    if (!copy.build_copy(*bitmap)) return;
-    VorBitmapHistogramTransform(copy.get(), map);
-    vorlite::core::WorkingArray<std::uint32_t> mapped;
-    if (!mapped.build(width, height)) return;
-    VorBuildIntegralImageGray(copy.get(), mapped.get());
-    // The mapped pixels are no longer needed: their storage, four bytes a
-    // pixel, holds the integral image of the unchanged bitmap.
-    auto* const original = reinterpret_cast<std::uint32_t*>(copy.get()->data);
-    VorBuildIntegralImageGray(bitmap, original);
-    if (height >= 1) vorlite::tone::clarity_local_means(bitmap, original, mapped.get(), radius, false);
+    vorlite::tone::blur_hist_map(bitmap, map, box_radius(bitmap->width, bitmap->height), false);
 }
 
 VOR_API void VorLocalContrastEnhanceProcessor(VorBitmap* bitmap) {

@@ -7,17 +7,6 @@
 #include "core/core_internal.h"
 #include "tone/tone_internal.h"
 
-namespace {
-
-// The grey level weighs 0.2 red, 0.7 green, 0.1 blue in double, then
-// rounds in float: narrowing first, then adding the half.
-std::uint32_t grey_level(const std::uint8_t* p) {
-    const double weighted = p[0] * 0.2 + p[1] * 0.7 + p[2] * 0.1;
-    return static_cast<std::uint32_t>(static_cast<float>(weighted) + 0.5f);
-}
-
-}  // namespace
-
 extern "C" {
 
 VOR_API uint32_t VorBuildIntegralImage(const VorBitmap* bitmap, uint32_t* red, uint32_t* green,
@@ -52,12 +41,12 @@ VOR_API void VorBuildIntegralImageGray(const VorBitmap* bitmap, uint32_t* sums) 
         const std::size_t row = static_cast<std::size_t>(y) * width;
         std::uint32_t total = 0;
         if (y == 0) {
-            for (std::uint32_t x = 0; x < width; ++x, p += 4) sums[x] = total += grey_level(p);
+            for (std::uint32_t x = 0; x < width; ++x, p += 4) sums[x] = total += vorlite::tone::grey_level(p);
             continue;
         }
         const std::uint32_t* above = sums + row - width;
         for (std::uint32_t x = 0; x < width; ++x, p += 4) {
-            total += grey_level(p);
+            total += vorlite::tone::grey_level(p);
             sums[row + x] = total + above[x];
         }
     }

@@ -30,6 +30,13 @@ void add_channel_noise(VorBitmap* bitmap, float intensity, std::uint32_t seed, b
 
 // Integral images: the sum over the inclusive rectangle x0..x1, y0..y1 of a
 // width-wide sum table, modulo 2^32 (four reads whatever the box size).
+// The grey level of the grey integral image: 0.2 red, 0.7 green, 0.1 blue
+// in double, then rounded in float: narrowing first, then adding the half.
+inline std::uint32_t grey_level(const std::uint8_t* p) {
+    const double weighted = p[0] * 0.2 + p[1] * 0.7 + p[2] * 0.1;
+    return static_cast<std::uint32_t>(static_cast<float>(weighted) + 0.5f);
+}
+
 inline std::uint32_t box_sum(const std::uint32_t* sums, std::uint32_t width, std::uint32_t x0,
                              std::uint32_t y0, std::uint32_t x1, std::uint32_t y1) {
     const auto at = [&](std::uint32_t x, std::uint32_t y) {
@@ -52,12 +59,11 @@ struct ExactDivider {
     std::uint32_t divide(std::uint32_t n) const { return static_cast<std::uint32_t>((n * multiplier) >> shift); }
 };
 
-// Local contrast: the per-pixel pass of VorBlurHistMap over the grey
-// integral images of the original and the mapped picture. The fast form
-// divides by multiplies where the divisor repeats; `reference` asks for
-// the plain divisions it is held against.
-void clarity_local_means(VorBitmap* bitmap, const std::uint32_t* original, const std::uint32_t* mapped, int radius,
-                         bool reference);
+// Local contrast: VorBlurHistMap with a given box radius, its integral
+// images streamed a few rows ahead of the pass with exact multiplies for
+// the repeated divisions, or (reference = true) as written: a mapped copy,
+// two full-size integral images and plain divisions.
+void blur_hist_map(VorBitmap* bitmap, const VorHistMap* map, int radius, bool reference);
 
 // Sharpening and soft focus: the shape of one box-hybrid pass for a bitmap
 // of the given size and amount. The pass sums 2r + 1 boxes of b pixels,
