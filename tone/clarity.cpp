@@ -39,7 +39,7 @@ int transfer(int channel, int detail, int mean_original, int mean_mapped) {
 // is exact even where the table entries have wrapped.
 //
 // The plain form divides twice a pixel by the box area and three times by
-// the original mean; it stays as the reference of the fast form below.
+// the original mean; it stays as the reference of the streamed pass below.
 void apply_local_means_reference(VorBitmap* bitmap, const std::uint32_t* original,
                                  const std::uint32_t* mapped, int radius) {
     const std::uint32_t width = bitmap->width;
