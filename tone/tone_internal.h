@@ -61,9 +61,10 @@ struct ExactDivider {
 
 // Local contrast: VorBlurHistMap with a given box radius, its integral
 // images streamed a few rows ahead of the pass with exact multiplies for
-// the repeated divisions, or (reference = true) as written: a mapped copy,
-// two full-size integral images and plain divisions.
-void blur_hist_map(VorBitmap* bitmap, const VorHistMap* map, int radius, bool reference);
+// the repeated divisions (whole boxes eight at a time where the processor
+// has 256-bit lanes and `lanes` allows), or (reference = true) as written:
+// a mapped copy, two full-size integral images and plain divisions.
+void blur_hist_map(VorBitmap* bitmap, const VorHistMap* map, int radius, bool reference, bool lanes = true);
 
 // Sharpening and soft focus: the shape of one box-hybrid pass for a bitmap
 // of the given size and amount. The pass sums 2r + 1 boxes of b pixels,

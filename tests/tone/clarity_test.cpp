@@ -79,7 +79,8 @@ TEST(ClarityDivisions, MultiplyAndShiftEqualDivisionOverTheWholeRange) {
 }
 
 // The pass with its integral images streamed a few rows ahead and the
-// repeated divisions as multiplies stores what the pass as written stores:
+// repeated divisions as multiplies, eight columns at a time or one by one,
+// stores what the pass as written stores:
 // single rows and columns, a radius of 0, radii past the picture, black
 // and flat pictures, a wide strip, a picture tall enough for the ring of
 // integral rows to wrap many times, and boxes too large for the multiply.
@@ -98,10 +99,12 @@ TEST(ClarityDivisions, StreamedPassGivesTheReferenceBytes) {
     }
     for (const Case& c : cases) {
         TestBitmap streamed = c.fill < 0 ? TestBitmap(c.w, c.h, 9) : grey(c.w, c.h, static_cast<uint8_t>(c.fill));
-        TestBitmap reference = streamed;
-        vorlite::tone::blur_hist_map(streamed.get(), &map, c.radius, false);
+        TestBitmap reference = streamed, one_by_one = streamed;
+        vorlite::tone::blur_hist_map(streamed.get(), &map, c.radius, false, true);
+        vorlite::tone::blur_hist_map(one_by_one.get(), &map, c.radius, false, false);
         vorlite::tone::blur_hist_map(reference.get(), &map, c.radius, true);
         EXPECT_TRUE(streamed == reference) << c.w << "x" << c.h << " radius " << c.radius << " fill " << c.fill;
+        EXPECT_TRUE(one_by_one == reference) << c.w << "x" << c.h << " radius " << c.radius << " fill " << c.fill;
     }
 }
 
