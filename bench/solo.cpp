@@ -96,6 +96,7 @@ void fail_unless(benchmark::State& state, int result, const char* what) {
 
 void add_solo() {
     add_solo_op("clarity", "VorEnhanceClarity", [](VorBitmap& bitmap) { VorEnhanceClarity(&bitmap, nullptr); });
+    for (const BitmapSize& size : kSizes) add_memcpy_floor("clarity", size);
     for (int mode = 0; mode < 4; ++mode) {
         add_solo_op("enhance" + std::to_string(mode), "VorAutoEnhance, mode " + std::to_string(mode),
                     [mode](VorBitmap& bitmap) { VorAutoEnhance(&bitmap, mode); });
