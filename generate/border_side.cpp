@@ -566,7 +566,7 @@ private:
 
 // paint_edges for the strip, its coverage taken a row at a time and only
 // where a tear may cover: every pixel left out would take coverage 0.
-void paint_strip(VorBitmap* bitmap, const VorColor& colour, std::uint32_t mode, float reach, StripRows& rows) {
+void paint_strip(VorBitmap* bitmap, const VorColor& colour, std::uint32_t mode, StripRows& rows) {
     const std::uint32_t width = bitmap->width;
     const std::uint32_t height = bitmap->height;
     const float opacity = static_cast<float>(colour.a) * vorlite::core::k_inv255;
@@ -645,7 +645,7 @@ void draw_double_sided(VorBitmap* bitmap, const VorBorderParams* params, bool ro
     }
     StripRows strip_rows(strip, inner, outer, width, height);
     if (!strip_rows.build()) return;
-    paint_strip(bitmap, params->color, mode, strip.reach(), strip_rows);
+    paint_strip(bitmap, params->color, mode, strip_rows);
 }
 
 }  // namespace vorlite::generate
