@@ -91,9 +91,6 @@ const std::vector<LegacyEffect>& legacy_effects();
 // a name the library does not know.
 bool run_legacy_effect(const std::string& name, VorBitmap* bitmap, const VLPLRunOptions& options);
 
-// The tool names a paint script may use, comma-separated.
-std::string tool_kind_list();
-
 int run_apply(const ApplyArgs& args);
 int run_check(const std::filesystem::path& effect);
 int run_adjust(const AdjustArgs& args);

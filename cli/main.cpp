@@ -11,6 +11,7 @@
 
 #include "commands.h"
 #include "image.h"
+#include "paint_session.h"
 
 namespace {
 
