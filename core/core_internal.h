@@ -4,7 +4,6 @@
 #define VORLITE_CORE_INTERNAL_H
 
 #include <array>
-#include <bit>
 #include <cstddef>
 #include <cstdint>
 #include <cstring>
@@ -15,9 +14,19 @@
 
 namespace vorlite::core {
 
+// The bits of a value read as another type of the same size: std::bit_cast,
+// through the compiler builtin beneath it, which every compiler we build
+// with has also where its standard library predates the name.
+template <typename To, typename From>
+constexpr To bit_cast(const From& from) {
+    static_assert(sizeof(To) == sizeof(From) && std::is_trivially_copyable_v<To> &&
+                  std::is_trivially_copyable_v<From>);
+    return __builtin_bit_cast(To, from);
+}
+
 // Float built from its exact bit pattern, so a constant never depends on
 // how a decimal literal happens to round.
-constexpr float float_bits(std::uint32_t bits) { return std::bit_cast<float>(bits); }
+constexpr float float_bits(std::uint32_t bits) { return bit_cast<float>(bits); }
 
 // 1/255 as the float nearest 0.003921569: the scale from a channel byte to
 // 0..1 in every single-precision step.

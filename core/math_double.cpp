@@ -9,7 +9,6 @@
 // build forbids contraction (-ffp-contract=off), so a*b + c stays two
 // roundings. Special inputs follow C99 Annex F; errno and the floating-point
 // flags are left alone, and a NaN result carries no promised payload.
-#include <bit>
 #include <cstdint>
 #include <limits>
 
@@ -21,8 +20,8 @@ namespace {
 
 constexpr double k_inf = std::numeric_limits<double>::infinity();
 
-constexpr std::uint64_t bits_of(double x) { return std::bit_cast<std::uint64_t>(x); }
-constexpr double from_bits(std::uint64_t b) { return std::bit_cast<double>(b); }
+constexpr std::uint64_t bits_of(double x) { return bit_cast<std::uint64_t>(x); }
+constexpr double from_bits(std::uint64_t b) { return bit_cast<double>(b); }
 constexpr std::uint32_t top12(double x) { return static_cast<std::uint32_t>(bits_of(x) >> 52); }
 constexpr std::uint32_t high_word(double x) { return static_cast<std::uint32_t>(bits_of(x) >> 32); }
 constexpr std::uint32_t low_word(double x) { return static_cast<std::uint32_t>(bits_of(x)); }

@@ -12,7 +12,6 @@
 // NaN argument comes back quiet with its payload, as an arithmetic step would
 // return it; an invalid operation gives the positive default NaN.
 #include <array>
-#include <bit>
 #include <cstdint>
 
 #include "core/core_internal.h"
@@ -20,9 +19,9 @@
 namespace vorlite::core {
 namespace {
 
-constexpr std::uint32_t bits_of(float x) { return std::bit_cast<std::uint32_t>(x); }
-constexpr std::uint64_t bits_of(double x) { return std::bit_cast<std::uint64_t>(x); }
-constexpr double double_bits(std::uint64_t bits) { return std::bit_cast<double>(bits); }
+constexpr std::uint32_t bits_of(float x) { return bit_cast<std::uint32_t>(x); }
+constexpr std::uint64_t bits_of(double x) { return bit_cast<std::uint64_t>(x); }
+constexpr double double_bits(std::uint64_t bits) { return bit_cast<double>(bits); }
 
 constexpr std::uint32_t k_sign = 0x80000000u;
 constexpr std::uint32_t k_quiet = 0x00400000u;
