@@ -151,9 +151,10 @@ std::string read_file(const std::filesystem::path& path) {
     std::error_code ec;
     if (std::filesystem::is_directory(path, ec)) throw Failure(path.string() + ": is a folder, not a file");
     // Sized once from the file's length: growing by appending would hold up
-    // to twice a large photo's bytes for a moment.
-    std::string text(static_cast<std::size_t>(std::filesystem::file_size(path, ec)), '\0');
-    if (ec) text.clear();
+    // to twice a large photo's bytes for a moment. A device or a pipe has no
+    // length and is read as it comes.
+    const std::uintmax_t length = std::filesystem::file_size(path, ec);
+    std::string text(ec ? 0 : static_cast<std::size_t>(length), '\0');
     in.read(text.data(), static_cast<std::streamsize>(text.size()));
     text.resize(static_cast<std::size_t>(in.gcount()));
     text.append(std::istreambuf_iterator<char>(in), std::istreambuf_iterator<char>());
