@@ -1,5 +1,6 @@
 // Vector lanes for pixel kernels, through the compiler's generic vector
-// extension: SSE2 on x86-64, pairs of scalar VFP operations on 32-bit ARM.
+// extension: SSE2 on x86-64, pairs of scalar VFP operations on 32-bit ARM,
+// 128-bit SIMD in WebAssembly.
 // Every lane performs exactly the IEEE operation of the scalar code (no
 // fused multiply-add: the library builds with -ffp-contract=off), so a
 // kernel written with these stores the same bytes as its scalar reference,
@@ -40,11 +41,12 @@
 #define VORLITE_EXACT_FLOAT_LANES 0
 #endif
 
-// Integer lanes held in vector registers: SSE2 or NEON. Elsewhere the
-// compiler splits every lane operation into scalar ones, and a kernel that
-// only pays where sixteen channels go at once keeps its scalar form.
+// Integer lanes held in vector registers: SSE2, NEON or WebAssembly's
+// 128-bit SIMD. Elsewhere the compiler splits every lane operation into
+// scalar ones, and a kernel that only pays where sixteen channels go at
+// once keeps its scalar form.
 #ifndef VORLITE_NATIVE_INTEGER_LANES
-#if VORLITE_VECTOR_LANES && (defined(__SSE2__) || defined(__ARM_NEON))
+#if VORLITE_VECTOR_LANES && (defined(__SSE2__) || defined(__ARM_NEON) || defined(__wasm_simd128__))
 #define VORLITE_NATIVE_INTEGER_LANES 1
 #else
 #define VORLITE_NATIVE_INTEGER_LANES 0
