@@ -48,11 +48,22 @@ export function readPhoto(name) {
 // Runs the native tool with the arguments, an output PNG in a fresh folder
 // appended; the decoded result.
 export function runTool(args) {
+  return runTools([args]);
+}
+
+// Runs the native tool several times, each on the previous one's output
+// (written as a PNG where the next run's input is null); the last result.
+export function runTools(runs) {
   const dir = mkdtempSync(join(tmpdir(), 'vorlite-web-'));
   try {
-    const out = join(dir, 'out.png');
-    execFileSync(tool, [...args.slice(0, 3), out, ...args.slice(3)], { stdio: ['ignore', 'ignore', 'pipe'] });
-    return decodePng(readFileSync(out));
+    let previous = null;
+    runs.forEach((args, i) => {
+      const out = join(dir, `out${i}.png`);
+      const input = args[2] ?? previous;
+      execFileSync(tool, [args[0], args[1], input, out, ...args.slice(3)], { stdio: ['ignore', 'ignore', 'pipe'] });
+      previous = out;
+    });
+    return decodePng(readFileSync(previous));
   } finally {
     rmSync(dir, { recursive: true, force: true });
   }
