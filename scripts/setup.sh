@@ -3,6 +3,9 @@
 # cross-test the library. Idempotent: quiet and quick when all is present.
 #   scripts/setup.sh          library, tool, tests, fuzzer, 32-bit ARM and musl cross-testing
 #   scripts/setup.sh --photos  the same, and the sample photographs of the demo
+#   scripts/setup.sh --web     the same, and what the browser page needs: emscripten,
+#                              Node.js and npm, Chromium, the page tests' driver, and
+#                              yajl's source (the machine's own version) to build for it
 set -euo pipefail
 root=$(cd "$(dirname "$0")/.." && pwd)
 
@@ -16,6 +19,17 @@ native_packages=(
   musl-tools
 )
 armhf_packages=(libyajl-dev:armhf)
+web_packages=(emscripten chromium dpkg-dev)
+
+photos=0
+web=0
+for arg in "$@"; do
+  case $arg in
+    --photos) photos=1 ;;
+    --web) web=1 ;;
+    *) echo "setup: unknown option '$arg' (--photos, --web)" >&2; exit 2 ;;
+  esac
+done
 
 as_root() {
   if [ "$(id -u)" -eq 0 ]; then "$@"; else sudo "$@"; fi
@@ -58,9 +72,66 @@ fetch_photos() {
   echo "setup: sample photos in $dest"
 }
 
-need=$(missing "${native_packages[@]}" "${armhf_packages[@]}")
+# Debian's source package of the yajl the machine has, unpacked into
+# build/web-deps for the WebAssembly build. apt needs the archive's source
+# lines for that: they are enabled beside its binary ones.
+fetch_yajl_source() {
+  local dest=$root/build/web-deps version
+  version=$(dpkg-query -W -f='${Version}' libyajl-dev)
+  [ -f "$dest/yajl-$version/src/yajl_tree.c" ] && return 0
+  if ! apt-get source --print-uris -qq "yajl=$version" 2>/dev/null | grep -q "yajl_"; then
+    local f
+    for f in /etc/apt/sources.list.d/*.sources; do
+      [ -f "$f" ] && grep -q '^URIs:.*/debian' "$f" && as_root sed -i -E 's/^Types: deb$/Types: deb deb-src/' "$f"
+    done
+    if [ -f /etc/apt/sources.list ] && ! grep -q '^deb-src' /etc/apt/sources.list; then
+      sed -n 's/^deb \(.*debian.*\)/deb-src \1/p' /etc/apt/sources.list | as_root tee -a /etc/apt/sources.list >/dev/null
+    fi
+    as_root apt-get update -qq >/dev/null 2>&1 || true
+  fi
+  local tmp
+  tmp=$(mktemp -d)
+  (cd "$tmp" && apt-get source -qq "yajl=$version" >/dev/null 2>&1) || {
+    echo "setup: error: could not fetch Debian's source of yajl $version" >&2
+    rm -rf "$tmp"
+    return 1
+  }
+  mkdir -p "$dest"
+  rm -rf "$dest/yajl-$version"
+  mv "$tmp"/yajl-*/ "$dest/yajl-$version"
+  rm -rf "$tmp"
+  echo "setup: yajl $version source in $dest/yajl-$version"
+}
+
+# The page tests' browser driver, from the npm registry at the locked
+# version; it drives Debian's Chromium and downloads no browser of its own.
+install_driver() {
+  local dir=$root/web/tests
+  [ -d "$dir/node_modules/puppeteer-core" ] && return 0
+  (cd "$dir" && PUPPETEER_SKIP_DOWNLOAD=1 npm ci --no-audit --no-fund --loglevel=error >/dev/null) || {
+    echo "setup: error: npm could not install the page tests' driver" >&2
+    return 1
+  }
+}
+
+finish() {
+  if [ "$photos" -eq 1 ] || [ "$web" -eq 1 ]; then fetch_photos; fi
+  if [ "$web" -eq 1 ]; then
+    fetch_yajl_source
+    install_driver
+  fi
+}
+
+wanted=("${native_packages[@]}" "${armhf_packages[@]}")
+if [ "$web" -eq 1 ]; then
+  wanted+=("${web_packages[@]}")
+  # Node.js may come from elsewhere than Debian with npm inside it.
+  command -v node >/dev/null || wanted+=(nodejs)
+  command -v npm >/dev/null || wanted+=(npm)
+fi
+need=$(missing "${wanted[@]}")
 if [ -z "$need" ] && [ "$want_armhf" -eq 0 ]; then
-  if [ "${1:-}" = --photos ]; then fetch_photos; fi
+  finish
   exit 0
 fi
 
@@ -79,4 +150,4 @@ if [ -n "$left" ]; then
   exit 1
 fi
 echo "setup: done"
-if [ "${1:-}" = --photos ]; then fetch_photos; fi
+finish

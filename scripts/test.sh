@@ -11,6 +11,8 @@
 #             on eight jobs, under ThreadSanitizer
 #   arm       the suite cross-built for 32-bit ARM hard-float, under qemu-arm
 #   install   cmake --install, then a CMake and a pkg-config consumer
+#   web       the library built to WebAssembly: its module under Node and the
+#             browser page in headless Chromium against the native tool
 #   fuzz      the effect-document fuzzer for FUZZ_SECONDS (default 60)
 # With no arguments every stage runs, in that order.
 set -euo pipefail
@@ -18,7 +20,7 @@ cd "$(dirname "$0")/.."
 root=$PWD
 jobs=$(nproc 2>/dev/null || echo 2)
 stages=("$@")
-[ ${#stages[@]} -eq 0 ] && stages=(native fma-off musl sanitize tsan arm install fuzz)
+[ ${#stages[@]} -eq 0 ] && stages=(native fma-off musl sanitize tsan arm install web fuzz)
 
 "$root/scripts/setup.sh"
 
@@ -90,12 +92,16 @@ for stage in "${stages[@]}"; do
       banner "install and consume"
       "$root/scripts/check_install.sh" "$root/build/native"
       ;;
+    web)
+      banner "WebAssembly module and browser page"
+      "$root/scripts/web.sh" test
+      ;;
     fuzz)
       banner "effect-document fuzzer, ${FUZZ_SECONDS:-60} s"
       "$root/scripts/fuzz.sh" "${FUZZ_SECONDS:-60}"
       ;;
     *)
-      echo "test.sh: unknown stage '$stage' (native, fma-off, musl, sanitize, tsan, arm, install, fuzz)" >&2
+      echo "test.sh: unknown stage '$stage' (native, fma-off, musl, sanitize, tsan, arm, install, web, fuzz)" >&2
       exit 2
       ;;
   esac

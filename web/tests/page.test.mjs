@@ -117,7 +117,7 @@ describe('looks', () => {
       const native = runTool(['apply', join(looksDir, look), join(photos, photo), '--seed', String(seed),
         '--strength', String(strength)]);
       assert.equal(await exportHash(), hash(native.rgba), look);
-      if (screenshots && look === 'cream-print.json') await page.screenshot({ path: join(screenshots, 'web-look.png') });
+      if (screenshots && look === 'cream-print.json') await page.screenshot({ path: join(screenshots, 'web-look.jpg'), quality: 85 });
     }
   });
 
@@ -175,7 +175,7 @@ describe('brushes', () => {
     await page.select('#gesture', 'stroke');
     await setRange('radius', 30);
     await stroke([[60, 400], [120, 420], [180, 430], [240, 420]]);
-    if (screenshots) await page.screenshot({ path: join(screenshots, 'web-brush.png') });
+    if (screenshots) await page.screenshot({ path: join(screenshots, 'web-brush.jpg'), quality: 85 });
     await page.click('#undo');
     await idle();
     const script = JSON.parse(await page.evaluate(() => window.vorlitePage.script()));
