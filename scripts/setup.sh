@@ -77,7 +77,7 @@ fetch_photos() {
 # lines for that: they are enabled beside its binary ones.
 fetch_yajl_source() {
   local dest=$root/build/web-deps version
-  version=$(dpkg-query -W -f='${Version}' libyajl-dev)
+  version=$(dpkg-query -W -f='${Version}' "libyajl-dev:$(dpkg --print-architecture)")
   [ -f "$dest/yajl-$version/src/yajl_tree.c" ] && return 0
   if ! apt-get source --print-uris -qq "yajl=$version" 2>/dev/null | grep -q "yajl_"; then
     local f

@@ -21,7 +21,7 @@ esac
 # Debian's emscripten looks for Debian's JavaScript packages (its optimizer
 # needs acorn) where Debian puts them.
 export NODE_PATH=/usr/share/nodejs
-yajl_source=$(ls -d "$root"/build/web-deps/yajl-"$(dpkg-query -W -f='${Version}' libyajl-dev)")
+yajl_source=$root/build/web-deps/yajl-$(dpkg-query -W -f='${Version}' "libyajl-dev:$(dpkg --print-architecture)")
 build=$root/build/web
 emcmake cmake -S "$root" -B "$build" -DCMAKE_BUILD_TYPE=Release -DYAJL_SOURCE_DIR="$yajl_source" >/dev/null
 cmake --build "$build" -j"$jobs" --target vorlite_web >/dev/null

@@ -327,7 +327,7 @@ bool has_avx2() {
 // right edge cuts, divided by their own area, and between them the columns
 // whose box is whole, all of one area, divided by a multiply.
 void local_means_row(std::uint8_t* row, std::uint32_t width, int radius, std::uint32_t box_rows,
-                     const BoxRows& original, const BoxRows& mapped, bool lanes) {
+                     const BoxRows& original, const BoxRows& mapped, [[maybe_unused]] bool lanes) {
     const auto& by_mean = mean_dividers();
     const int last_x = static_cast<int>(width) - 1;
     const int inner_first = std::min(radius, last_x + 1);
@@ -442,9 +442,9 @@ private:
 
     const VorBitmap& bitmap_;
     const VorHistMap& map_;
-    bool lanes_;
+    [[maybe_unused]] bool lanes_;  // read by the 256-bit lanes only
     std::uint32_t rows_;
-    std::uint32_t wide_map_[3][256] = {};
+    [[maybe_unused]] std::uint32_t wide_map_[3][256] = {};
     WorkingArray<std::uint32_t> original_grey_;
     WorkingArray<std::uint32_t> mapped_grey_;
     std::int64_t built_ = -1;

@@ -243,6 +243,10 @@ TEST_F(Vorlite, CheckExplainsExactlyWhyADocumentWillNotRun) {
             << "got: " << outcome.err;
         EXPECT_EQ(lines(outcome.err), 1u) << outcome.err;
     }
+    // A device has no length; read as it comes, it is an empty document.
+    const Outcome empty = run("check /dev/null");
+    EXPECT_EQ(empty.status, 1);
+    EXPECT_EQ(empty.err, "vorlite: /dev/null: line 1, column 1: invalid JSON (parse error: premature EOF)\n");
 }
 
 TEST_F(Vorlite, CheckPassesARunnableDocumentAndListsItsProcessors) {
