@@ -43,8 +43,21 @@ function call(type, payload = {}, { transfer = [], onProgress } = {}) {
   });
 }
 
+// Work of the page's own that ends in worker calls (opening a photo) counts
+// as busy from its first step.
+let tasks = 0;
+async function track(promise) {
+  tasks++;
+  try {
+    return await promise;
+  } finally {
+    tasks--;
+    settle();
+  }
+}
+
 function settle() {
-  if (busy > 0 || lookTimer !== null) return;
+  if (busy > 0 || tasks > 0 || lookTimer !== null) return;
   const waiters = idleWaiters;
   idleWaiters = [];
   waiters.forEach((resolve) => resolve());
@@ -156,9 +169,8 @@ async function openPhoto(blob, name) {
   return true;
 }
 
-async function openUrl(url) {
-  const response = await fetch(url);
-  return openPhoto(await response.blob(), url.split('/').pop());
+function openUrl(url) {
+  return track(fetch(url).then(async (response) => openPhoto(await response.blob(), url.split('/').pop())));
 }
 
 async function loadSamples() {
@@ -466,13 +478,13 @@ function bindRange(id, format) {
 }
 
 function wire() {
-  $('file').addEventListener('change', (e) => e.target.files[0] && openPhoto(e.target.files[0], e.target.files[0].name));
+  $('file').addEventListener('change', (e) => e.target.files[0] && track(openPhoto(e.target.files[0], e.target.files[0].name)));
   const frame = $('frame');
   frame.addEventListener('dragover', (e) => e.preventDefault());
   frame.addEventListener('drop', (e) => {
     e.preventDefault();
     const file = e.dataTransfer.files[0];
-    if (file) openPhoto(file, file.name);
+    if (file) track(openPhoto(file, file.name));
   });
 
   bindRange('seed', (v) => String(v));

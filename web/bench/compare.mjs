@@ -9,7 +9,7 @@ import { tmpdir } from 'node:os';
 import { join } from 'node:path';
 
 import { decodePng } from '../tests/png.mjs';
-import { root } from '../tests/harness.mjs';
+import { loadLibrary, root } from '../tests/harness.mjs';
 
 const [nativeBench, wasmBench, roundsArg] = process.argv.slice(2);
 const rounds = Number(roundsArg ?? 5);
@@ -43,6 +43,36 @@ try {
   console.log('|---|---:|---:|---:|');
   row('look_ns_per_pixel', `look "${look}" (five processors), 12 MP`, 'ns/px');
   row('preview_box_ms', 'preview box after a stroke segment, radius 40, 1080 preview', 'ms');
+  await lookLatency(photo);
 } finally {
   rmSync(dir, { recursive: true, force: true });
+}
+
+// What the page waits for when a look or a slider changes: every bundled
+// look on a 1080 x 720 preview in the module, as the worker runs it.
+async function lookLatency(photo) {
+  const library = await loadLibrary();
+  const width = 1080;
+  const height = 720;
+  const preview = new Uint8Array(width * height * 4);
+  for (let y = 0; y < height; ++y) {
+    for (let x = 0; x < width; ++x) {
+      const from = (Math.floor((y * photo.height) / height) * photo.width + Math.floor((x * photo.width) / width)) * 4;
+      preview.set(photo.rgba.subarray(from, from + 4), (y * width + x) * 4);
+    }
+  }
+  console.log('\nEach bundled look on a 1080 x 720 preview in the module (median of 5, ms):\n');
+  console.log('| look | ms |');
+  console.log('|---|---:|');
+  for (const name of readdirSync(looksDir).filter((n) => n.endsWith('.json')).sort()) {
+    const text = readFileSync(join(looksDir, name), 'utf8');
+    const times = [];
+    for (let r = 0; r < 5; ++r) {
+      const start = performance.now();
+      library.apply(text, preview, width, height, { seed: r });
+      times.push(performance.now() - start);
+    }
+    times.sort((a, b) => a - b);
+    console.log(`| ${name} | ${times[2].toFixed(1)} |`);
+  }
 }

@@ -33,8 +33,11 @@ export function hash(rgba) {
 // A sample photo's RGBA bytes; a JPEG as the native tool decodes it
 // (through a document that leaves the pixels as they are).
 export function readPhoto(name) {
-  const path = join(photos, name);
-  if (!/\.jpe?g$/i.test(name)) return decodePng(readFileSync(path));
+  return readImage(join(photos, name));
+}
+
+export function readImage(path) {
+  if (!/\.jpe?g$/i.test(path)) return decodePng(readFileSync(path));
   const dir = mkdtempSync(join(tmpdir(), 'vorlite-web-'));
   try {
     const document = join(dir, 'as-is.json');

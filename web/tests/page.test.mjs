@@ -10,7 +10,7 @@ import { after, before, describe, test } from 'node:test';
 import puppeteer from 'puppeteer-core';
 
 import { serve } from '../serve.mjs';
-import { hash, moduleDir, photos, root, runTool, runTools, toolCheck } from './harness.mjs';
+import { hash, moduleDir, photos, readImage, readPhoto, root, runTool, runTools, toolCheck } from './harness.mjs';
 
 const chromium = process.env.CHROMIUM ?? '/usr/bin/chromium';
 const screenshots = process.env.VORLITE_SCREENSHOTS;
@@ -188,6 +188,33 @@ describe('brushes', () => {
     ]);
     assert.equal(await exportHash(), hash(native.rgba));
   });
+});
+
+test('a JPEG sample opens with the pixels the native tool decodes', async () => {
+  await setEditor('');
+  await page.click('#clear');
+  await page.click('.sample[title="rocket.jpg"]');
+  await idle();
+  assert.deepEqual(await page.evaluate(() => window.vorlitePage.preview), { width: 640, height: 427 });
+  assert.equal(await exportHash(), hash(readPhoto('rocket.jpg').rgba));
+});
+
+// The JPEG with an EXIF segment that says how to turn it upright.
+function withOrientation(jpeg, orientation) {
+  const tiff = [0x4d, 0x4d, 0, 0x2a, 0, 0, 0, 8, 0, 1, 0x01, 0x12, 0, 3, 0, 0, 0, 1, 0, orientation, 0, 0, 0, 0, 0, 0];
+  const body = Buffer.concat([Buffer.from('Exif\0\0', 'latin1'), Buffer.from(tiff)]);
+  const marker = Buffer.from([0xff, 0xe1, (body.length + 2) >> 8, (body.length + 2) & 255]);
+  return Buffer.concat([jpeg.subarray(0, 2), marker, body, jpeg.subarray(2)]);
+}
+
+test('a photo taken on its side is turned upright by its EXIF orientation, as the tool does', async () => {
+  const path = join(scratch, 'sideways.jpg');
+  writeFileSync(path, withOrientation(readFileSync(join(photos, 'rocket.jpg')), 6));
+  const input = await page.$('#file');
+  await input.uploadFile(path);
+  await idle();
+  assert.deepEqual(await page.evaluate(() => window.vorlitePage.preview), { width: 427, height: 640 });
+  assert.equal(await exportHash(), hash(readImage(path).rgba));
 });
 
 test('a file that is not an image gives a clear message and keeps the photo', async () => {
