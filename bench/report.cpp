@@ -275,9 +275,42 @@ void solo_table(std::ostringstream& out, const Inputs& in) {
         if (in_pairs(operation) || is_document(operation) || is_generated(operation)) continue;
         const Median* small = find(in.single, key(operation, kOurs, kSmall));
         const Median* large = find(in.single, key(operation, kOurs, kLarge));
+        if (small == nullptr && large == nullptr) continue;  // measured at another size only
         const std::string& label = large != nullptr ? large->label : small->label;
         out << "| " << label << " | " << per_pixel(small) << " | " << per_pixel(large) << " | "
             << large_ms(large) << " |\n";
+    }
+    out << "\n";
+}
+
+// The tool engine's calls on the preview a phone edits, in milliseconds a
+// call: a touch (a dab, a stroke segment, the box it re-renders) has to fit
+// a 120 Hz frame with room for a slower phone, and a tool's set-up must not
+// be felt.
+constexpr const char* kToolPreviewSize = "1080";
+
+void tool_table(std::ostringstream& out, const Inputs& in) {
+    std::vector<std::pair<std::string, const Median*>> rows;
+    for (const std::string& operation : our_operations(in.single)) {
+        const Median* m = find(in.single, operation + "/" + kOurs + "/" + kToolPreviewSize);
+        if (operation.rfind("tool_", 0) == 0 && m != nullptr) rows.emplace_back(operation, m);
+    }
+    if (rows.empty()) return;
+    std::sort(rows.begin(), rows.end(), [](const auto& a, const auto& b) { return natural_less(a.first, b.first); });
+    out << "## Interactive tools\n\n";
+    out << "The tool engine's calls on a " << kToolPreviewSize << " x " << kToolPreviewSize
+        << " preview, one thread, milliseconds a call by CPU time.\n\n";
+    out << "| call | ms | goal | met |\n|---|---:|---:|---|\n";
+    for (const auto& [operation, m] : rows) {
+        const double ms = m->cpu_ns_per_pixel * m->pixels * 1e-6;
+        double goal = 0.0;
+        if (operation.rfind("tool_init_", 0) == 0) goal = 50.0;
+        if (operation.rfind("tool_dab_", 0) == 0 || operation == "tool_segment" || operation == "tool_preview_box") {
+            goal = 1.0;
+        }
+        out << "| " << m->label << " | " << fixed(ms, ms < 1.0 ? 3 : 1) << " | "
+            << (goal > 0.0 ? "< " + fixed(goal, 0) : std::string("-")) << " | "
+            << (goal > 0.0 ? met(ms < goal) : std::string("-")) << " |\n";
     }
     out << "\n";
 }
@@ -436,6 +469,7 @@ std::string render(const Inputs& inputs) {
     pairs_table(out, inputs);
     growth_table(out, inputs);
     solo_table(out, inputs);
+    tool_table(out, inputs);
     generated_table(out, inputs);
     flare_box_table(out, inputs);
     document_table(out, inputs);

@@ -210,6 +210,25 @@ TEST(BenchReport, ListsTheDocumentStepsBeforeTheirTotal) {
     EXPECT_NE(text.find("bench/five.json"), std::string::npos);
 }
 
+TEST(BenchReport, JudgesEachToolCallOnThePreviewInMilliseconds) {
+    report::Inputs inputs;
+    inputs.single = parsed({
+        {"tool_dab_3/ours/1080", "median", 0.25, 0.25, "ms", 1080 * 1080, "dab"},
+        {"tool_preview_box/ours/1080", "median", 1.5, 1.5, "ms", 1080 * 1080, "box"},
+        {"tool_init_10/ours/1080", "median", 12.0, 12.0, "ms", 1080 * 1080, "init ten"},
+        {"tool_init_5/ours/1080", "median", 60.0, 60.0, "ms", 1080 * 1080, "init five"},
+        {"tool_preview/ours/1080", "median", 3.0, 3.0, "ms", 1080 * 1080, "whole preview"},
+        {"tool_hires_5/ours/12MP", "median", 300.0, 300.0, "ms", 12e6, "hires"},
+    });
+    const std::string text = report::render(inputs);
+    EXPECT_EQ(line_with(text, {"| dab |"}), "| dab | 0.250 | < 1 | yes |");
+    EXPECT_EQ(line_with(text, {"| box |"}), "| box | 1.5 | < 1 | **no** |");
+    EXPECT_EQ(line_with(text, {"| init five |"}), "| init five | 60.0 | < 50 | **no** |");
+    EXPECT_EQ(line_with(text, {"| whole preview |"}), "| whole preview | 3.0 | - | - |");
+    EXPECT_LT(text.find("| init five |"), text.find("| init ten |"));
+    EXPECT_NE(line_with(text, {"| hires |"}), "");
+}
+
 TEST(BenchReport, GivesTheMemoryRatioOrWhyItIsMissing) {
     report::Inputs inputs;
     inputs.single = parsed({});
