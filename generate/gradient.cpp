@@ -304,10 +304,7 @@ void draw_plain(VorBitmap* bitmap, const Coordinates& c, const VorColor* table, 
         if (settle && c.index_range(y, &lo, &hi)) {
             rows.settle(lo, hi);
             vorlite::core::for_each_pixel(row, width, [&](std::uint8_t* p) {
-                const std::uint8_t* r = rows.settled_rows(*index++);
-                p[0] = r[p[0]];
-                p[1] = r[256 + p[1]];
-                p[2] = r[512 + p[2]];
+                vorlite::core::map_pixel(p, reinterpret_cast<const std::uint8_t(*)[256]>(rows.settled_rows(*index++)));
             });
             continue;
         }
