@@ -181,6 +181,43 @@ TEST(ToolPreview, MixDividesBy256AndClampsItsBox) {
     EXPECT_TRUE(wrong.unchanged());
 }
 
+TEST(ToolPreview, EveryCoverageMixesEveryColumnAsTheRuleSays) {
+    // Every coverage in a row, bytes biased to the extremes, boxes that
+    // start and end at every column offset: pixels taken four at a time
+    // and the rest one by one must all follow the one rule.
+    constexpr uint32_t width = 263, height = 3;
+    TestBitmap image(width, height), full(width, height), mask(width, height);
+    uint32_t state = 12345;
+    const auto next = [&state] {
+        state = state * 1664525u + 1013904223u;
+        const uint32_t v = state >> 24;
+        return static_cast<uint8_t>(v < 32 ? 0 : v > 223 ? 255 : v);
+    };
+    for (uint32_t i = 0; i < width * height; ++i) {
+        for (int c = 0; c < 4; ++c) {
+            image.bytes[4 * i + c] = next();
+            full.bytes[4 * i + c] = next();
+        }
+        mask.bytes[4 * i + 3] = static_cast<uint8_t>(i % 256);
+    }
+    for (const int32_t x0 : {0, 1, 2, 3, 5}) {
+        for (const int32_t x1 : {static_cast<int32_t>(width) - 1, 200, 7, 9}) {
+            TestBitmap out(width, height, VorColor{9, 9, 9, 42});
+            VorToolRenderPreviewBox(out.get(), image.get(), full.get(), mask.get(), x0, 0, x1, 2, nullptr);
+            for (uint32_t i = 0; i < width * height; ++i) {
+                const auto x = static_cast<int32_t>(i % width);
+                const uint32_t m = mask.bytes[4 * i + 3];
+                for (int c = 0; c < 4; ++c) {
+                    const uint32_t mixed = ((255 - m) * image.bytes[4 * i + c] + m * full.bytes[4 * i + c] + 127) >> 8;
+                    const uint32_t expected = c == 3 ? 42 : x >= x0 && x <= x1 ? mixed : 9;
+                    ASSERT_EQ(out.bytes[4 * i + c], expected) << "pixel " << i << " channel " << c << " box " << x0
+                                                              << ".." << x1;
+                }
+            }
+        }
+    }
+}
+
 TEST(ToolHiRes, PaintStateCompositesWhateverTheParametersSayOthersBlendThroughTheMask) {
     TestBitmap photo(16, 12), mask(16, 12);
     Tool tool(3);
