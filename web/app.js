@@ -57,7 +57,7 @@ async function track(promise) {
 }
 
 function settle() {
-  if (busy > 0 || tasks > 0 || lookTimer !== null) return;
+  if (busy > 0 || tasks > 0 || lookTimer !== null || lookRunning) return;
   const waiters = idleWaiters;
   idleWaiters = [];
   waiters.forEach((resolve) => resolve());
@@ -165,7 +165,7 @@ async function openPhoto(blob, name) {
   draw($('after'), reply.rgba, reply.width, reply.height);
   $('drop').hidden = true;
   await applyLook();
-  renderThumbnails();
+  await renderThumbnails();
   return true;
 }
 
@@ -222,12 +222,40 @@ function chooseLook(index) {
   scheduleLook(0);
 }
 
+// A slider runs the look at once; while a run is under way, further
+// changes wait for it and then run once, with the latest settings. Typing
+// waits for a pause first.
 let lookTimer = null;
-function scheduleLook(delay = 120) {
+let lookRunning = false;
+let lookAgain = false;
+
+async function runLook() {
+  if (lookRunning) {
+    lookAgain = true;
+    return;
+  }
+  lookRunning = true;
+  try {
+    do {
+      lookAgain = false;
+      await applyLook();
+    } while (lookAgain);
+  } finally {
+    lookRunning = false;
+    settle();
+  }
+}
+
+function scheduleLook(delay = 150) {
   if (lookTimer !== null) clearTimeout(lookTimer);
+  lookTimer = null;
+  if (delay === 0) {
+    runLook();
+    return;
+  }
   lookTimer = setTimeout(() => {
     lookTimer = null;
-    applyLook().finally(settle);
+    runLook();
   }, delay);
 }
 
@@ -491,7 +519,7 @@ function wire() {
   bindRange('strength', (v) => v.toFixed(2));
   bindRange('radius', (v) => String(v));
   bindRange('tool-strength', (v) => v.toFixed(2));
-  for (const id of ['seed', 'strength']) $(id).addEventListener('input', () => scheduleLook(60));
+  for (const id of ['seed', 'strength']) $(id).addEventListener('input', () => scheduleLook(0));
   $('borders').addEventListener('change', () => scheduleLook(0));
   $('seed').addEventListener('change', renderThumbnails);
   $('strength').addEventListener('change', renderThumbnails);
