@@ -23,7 +23,13 @@ esac
 export NODE_PATH=/usr/share/nodejs
 yajl_source=$root/build/web-deps/yajl-$(dpkg-query -W -f='${Version}' "libyajl-dev:$(dpkg --print-architecture)")
 build=$root/build/web
-emcmake cmake -S "$root" -B "$build" -DCMAKE_BUILD_TYPE=Release -DYAJL_SOURCE_DIR="$yajl_source" >/dev/null
+mkdir -p "$build"
+# emcmake announces its command line; only a failure's output is shown.
+if ! emcmake cmake -S "$root" -B "$build" -DCMAKE_BUILD_TYPE=Release -DYAJL_SOURCE_DIR="$yajl_source" \
+  >"$build/configure.log" 2>&1; then
+  cat "$build/configure.log" >&2
+  exit 1
+fi
 cmake --build "$build" -j"$jobs" --target vorlite_web >/dev/null
 
 # The native tool the tests and the benchmark hold the module against.
