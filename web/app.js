@@ -620,6 +620,11 @@ window.vorlitePage = {
   },
 };
 
+// Whatever else goes wrong (the worker out of memory on a huge photo, a
+// sample that will not load) is said on the page, not only in the console.
+window.addEventListener('unhandledrejection', (event) => notice(String(event.reason?.message ?? event.reason)));
+worker.addEventListener('error', (event) => notice(`the library's worker stopped: ${event.message ?? 'unknown error'}`));
+
 window.vorlitePage.ready = (async () => {
   fillTools();
   wire();
