@@ -109,6 +109,15 @@ std::vector<uint8_t> probe_pixels() {
 
 }  // namespace
 
+VLPLRunOptions run_options(uint32_t seed, double strength, bool borders) {
+    VLPLRunOptions options;
+    VorEffectInitParams(&options);
+    options.seed = seed;
+    options.strength = strength;
+    options.bordersEnabled = borders ? 1 : 0;
+    return options;
+}
+
 std::optional<std::string> json_syntax_error(std::string_view text) {
     yajl_handle parser = yajl_alloc(nullptr, nullptr, nullptr);
     yajl_config(parser, yajl_allow_comments, 1);

@@ -21,6 +21,10 @@ inline constexpr std::array<std::string_view, 13> kProcessorNames = {
     "colorMatrixTransform", "intensityMap", "flare", "contrast", "blendWithColor",
     "noise", "sharpness", "gradient"};
 
+// The library's run options for a seed, a strength and the borders switch,
+// the rest at their defaults.
+VLPLRunOptions run_options(uint32_t seed, double strength, bool borders);
+
 // The position and yajl's own description of the first syntax error, as
 // "line L, column C: invalid JSON (...)", or nothing for well-formed JSON.
 // Comments are allowed, as the library's loader allows them.

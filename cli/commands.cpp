@@ -8,14 +8,7 @@
 
 namespace vorlite::cli {
 
-VLPLRunOptions RunSettings::options() const {
-    VLPLRunOptions options;
-    VorEffectInitParams(&options);
-    options.seed = seed;
-    options.strength = strength;
-    options.bordersEnabled = no_borders ? 0 : 1;
-    return options;
-}
+VLPLRunOptions RunSettings::options() const { return run_options(seed, strength, !no_borders); }
 
 int run_apply(const ApplyArgs& args) {
     require_format(args.input);

@@ -100,11 +100,6 @@ public:
                                                           : softness_;
             }
         }
-        if (style_ == VOR_BORDER_BULGE || style_ == VOR_BORDER_GLIMMO) {
-            // The ease at the two ends of the ramp, where most pixels lie.
-            eased_empty_ = 0.5f - 0.5f * vorlite::core::cosf(k_pi * 0.0f);
-            eased_full_ = 0.5f - 0.5f * vorlite::core::cosf(k_pi * 1.0f);
-        }
         return true;
     }
 
@@ -216,8 +211,11 @@ private:
             case VOR_BORDER_BULGE:
             case VOR_BORDER_GLIMMO: {
                 const float u = std::clamp(inside / soft + 0.5f, 0.0f, 1.0f);
-                const float eased = u == 0.0f   ? eased_empty_
-                                    : u == 1.0f ? eased_full_
+                // The two ends of the ramp, where most pixels lie, without a
+                // cosine: cos 0 is 1, and the cosine of the float nearest pi
+                // rounds to -1.
+                const float eased = u == 0.0f   ? 0.0f
+                                    : u == 1.0f ? 1.0f
                                                 : 0.5f - 0.5f * vorlite::core::cosf(k_pi * u);
                 // The wet-plate edge darkens more steeply than it fades.
                 return style_ == VOR_BORDER_GLIMMO ? std::sqrt(eased) : eased;
@@ -239,8 +237,6 @@ private:
     float fringe_power_ = 1.5f;
     float streaks_ = 1.0f;
     float corner_ = 0.0f;
-    float eased_empty_ = 0.0f;
-    float eased_full_ = 1.0f;
     vorlite::core::WorkingArray<float> reach_[4];
     vorlite::core::WorkingArray<float> soft_[4];
 };
@@ -251,8 +247,6 @@ void lay(std::uint8_t* p, const VorColor& colour, std::uint32_t mode, float opac
     vorlite::core::store_pixel(p, out);
 }
 
-// Visits the pixels within `reach` of an edge, row by row; `cover` gives
-// each one's coverage.
 // Most of a band is covered fully: one colour at one opacity, where each
 // channel's result depends on its own level alone, so three tables give
 // the blend's bytes. The colour mode mixes channels and has none.
@@ -279,6 +273,21 @@ private:
     std::uint8_t blue_[256];
 };
 
+// Lays the colour over columns x0 to x1 of a row at each column's coverage:
+// the full cover's tables where it is whole, nothing where it is none.
+void lay_covered(std::uint8_t* row, const float* coverage, std::uint32_t x0, std::uint32_t x1, const FullCover& full,
+                 const VorColor& colour, std::uint32_t mode, float opacity) {
+    for (std::uint32_t x = x0; x < x1; ++x) {
+        if (coverage[x] == 1.0f && full.tabled()) {
+            full.lay(row + std::size_t{x} * 4);
+        } else if (coverage[x] > 0.0f) {
+            lay(row + std::size_t{x} * 4, colour, mode, opacity * coverage[x]);
+        }
+    }
+}
+
+// Visits the pixels within `reach` of an edge, row by row; `cover` gives
+// each one's coverage.
 template <typename Cover>
 void paint_edges(VorBitmap* bitmap, const VorColor& colour, std::uint32_t mode, float reach, Cover cover) {
     const std::uint32_t width = bitmap->width;
@@ -319,13 +328,7 @@ void paint_edge_rows(VorBitmap* bitmap, const VorColor& colour, std::uint32_t mo
     const auto lay_span = [&](std::uint32_t y, std::uint32_t x0, std::uint32_t x1) {
         std::uint8_t* row = bitmap->data + static_cast<std::size_t>(y) * width * 4;
         row_cover(y, x0, x1, coverage);
-        for (std::uint32_t x = x0; x < x1; ++x) {
-            if (coverage[x] == 1.0f && full.tabled()) {
-                full.lay(row + std::size_t{x} * 4);
-            } else if (coverage[x] > 0.0f) {
-                lay(row + std::size_t{x} * 4, colour, mode, opacity * coverage[x]);
-            }
-        }
+        lay_covered(row, coverage, x0, x1, full, colour, mode, opacity);
     };
     for (std::uint32_t y = 0; y < height; ++y) {
         if (y < margin || height - 1 - y < margin) {
@@ -572,13 +575,7 @@ void paint_strip(VorBitmap* bitmap, const VorColor& colour, std::uint32_t mode, 
     const float opacity = static_cast<float>(colour.a) * vorlite::core::k_inv255;
     const FullCover full(colour, mode, opacity);
     const auto lay_span = [&](std::uint8_t* row, const float* c, std::uint32_t x0, std::uint32_t x1) {
-        for (std::uint32_t x = x0; x < x1; ++x) {
-            if (c[x] == 1.0f && full.tabled()) {
-                full.lay(row + std::size_t{x} * 4);
-            } else if (c[x] > 0.0f) {
-                lay(row + std::size_t{x} * 4, colour, mode, opacity * c[x]);
-            }
-        }
+        lay_covered(row, c, x0, x1, full, colour, mode, opacity);
     };
     for (std::uint32_t y = 0; y < height; ++y) {
         std::uint8_t* row = bitmap->data + static_cast<std::size_t>(y) * width * 4;

@@ -44,16 +44,16 @@ musl_checker() {
   arch=$(gcc -dumpmachine | sed 's/-linux-gnu$//')
   mkdir -p "$dir/include"
   ln -sfn /usr/include/yajl "$dir/include/yajl"
-  local cxx=(g++ -std=c++20 -O2 -ffp-contract=off -fno-fast-math -fno-exceptions -fno-rtti
-    -specs "/usr/lib/$arch-linux-musl/musl-gcc.specs" -nostdinc
+  # musl's compiler wrapper, with g++ behind it for the C++ files.
+  local cxx=(env REALGCC=g++ musl-gcc -std=c++20 -O2 -ffp-contract=off -fno-fast-math -fno-exceptions -fno-rtti
+    -nostdinc
     -isystem "/usr/include/c++/$(g++ -dumpversion)"
     -isystem "/usr/include/$arch-linux-gnu/c++/$(g++ -dumpversion)"
     -isystem "/usr/include/$arch-linux-musl" -isystem "$(g++ -print-file-name=include)"
     -isystem "$dir/include" '-D__GLIBC_PREREQ(major,minor)=0' -I"$root" -I"$root/include")
   "${cxx[@]}" -c "$root/core/math_float.cpp" -o "$dir/math_float.o"
   "${cxx[@]}" -c "$root/scripts/check_math.cpp" -o "$dir/check_math.o"
-  gcc -specs "/usr/lib/$arch-linux-musl/musl-gcc.specs" -static "$dir/check_math.o" "$dir/math_float.o" \
-    -o "$dir/check_math" -lm
+  musl-gcc -static "$dir/check_math.o" "$dir/math_float.o" -o "$dir/check_math" -lm
   "$dir/check_math" self
 }
 

@@ -33,15 +33,6 @@ struct Painting {
 };
 std::optional<Painting> painting;
 
-VLPLRunOptions run_options(uint32_t seed, double strength, int borders) {
-    VLPLRunOptions options;
-    VorEffectInitParams(&options);
-    options.seed = seed;
-    options.strength = strength;
-    options.bordersEnabled = borders ? 1 : 0;
-    return options;
-}
-
 Image copy_of(const uint8_t* rgba, uint32_t width, uint32_t height) {
     Image image(width, height);
     std::memcpy(image.rgba.data(), rgba, image.rgba.size());
@@ -59,7 +50,8 @@ EMSCRIPTEN_KEEPALIVE const char* vw_message() { return message.c_str(); }
 // 1 when the document runs, and the message lists its processors; 0 with
 // the one-line diagnostic of `vorlite check`.
 EMSCRIPTEN_KEEPALIVE int vw_check(const char* text, uint32_t seed, double strength, int borders) {
-    const vorlite::cli::Verdict verdict = vorlite::cli::check_effect(text, run_options(seed, strength, borders));
+    const VLPLRunOptions options = vorlite::cli::run_options(seed, strength, borders != 0);
+    const vorlite::cli::Verdict verdict = vorlite::cli::check_effect(text, options);
     if (verdict.error) {
         message = *verdict.error;
         return 0;
@@ -73,7 +65,7 @@ EMSCRIPTEN_KEEPALIVE int vw_check(const char* text, uint32_t seed, double streng
 // the diagnostic (the pixels then untouched) when it will not run.
 EMSCRIPTEN_KEEPALIVE int vw_apply(const char* text, uint8_t* rgba, uint32_t width, uint32_t height, uint32_t seed,
                                   double strength, int borders) {
-    const VLPLRunOptions options = run_options(seed, strength, borders);
+    const VLPLRunOptions options = vorlite::cli::run_options(seed, strength, borders != 0);
     const vorlite::cli::Verdict verdict = vorlite::cli::check_effect(text, options);
     if (verdict.error) {
         message = *verdict.error;
